@@ -1,0 +1,61 @@
+#include "Zel_Req.h"
+
+#include "Zel_Debug.h"
+#include "zel_qtcompat_p.h"
+
+#include "Orv_Result.h"
+#include "Orv_ResultQ.h"
+#include "Orv_ResultsCB.h"
+
+Zel_Req::Zel_Req(QString name, boost::shared_ptr<Orv_ResultsCB> callback)
+    : Orv_Request(name.toStdString(), std::move(callback))
+{
+}
+
+Zel_Req::Zel_Req(const Zel_Req& other)
+    : Orv_Request(other)
+    , mResultQ(other.mResultQ)
+{
+}
+
+Zel_Req::~Zel_Req() = default;
+
+const QString Zel_Req::getName() const
+{
+    return QString::fromLatin1(name().c_str());
+}
+
+boost::shared_ptr<Orv_ResultQ> Zel_Req::getORVResultQ() const
+{
+    return mResultQ;
+}
+
+bool Zel_Req::process(boost::shared_ptr<Orv_ResultQ> resultQ)
+{
+    mResultQ = std::move(resultQ);
+
+    const boost::shared_ptr<Zel_Debug> debug = Zel_Debug::instance();
+    QString idText;
+    ZelCompat::ElapsedTimer timer;
+    if (debug->getEnabled()) {
+        idText = QStringLiteral(" ID:") + QString::number(static_cast<long>(getRequestID().getValue()), 10)
+            + QLatin1Char(')');
+        debug->debug(getName(), QStringLiteral("processing request") + idText, 0);
+        timer.start();
+    }
+
+    bool answer = false;
+    if (mResultQ) {
+        boost::shared_ptr<Orv_Result> result;
+        answer = doProcess(result);
+        if (result)
+            mResultQ->Push(result);
+    }
+
+    if (debug->getEnabled()) {
+        // Tracing switched on during the work: the timer never ran, report 0.
+        const int elapsed = timer.isValid() ? static_cast<int>(timer.elapsed()) : 0;
+        debug->debug(getName(), QStringLiteral("processed request") + idText, elapsed);
+    }
+    return answer;
+}

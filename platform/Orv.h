@@ -1,0 +1,28 @@
+// Orv: the engine's log.
+//
+// Orv::log() receives each trace line (Latin-1 text) and hands it to the log
+// handler that a program or test installed with setLogHandler(). Without a
+// handler lines are discarded: the zel trace log also writes every line to
+// Qt's debug output, so nothing is lost by default. Thread-safe; the handler
+// may be called from any thread and must not call setLogHandler() itself.
+#ifndef ORV_H
+#define ORV_H
+
+#include "zel_platform_export.h"
+
+#include <functional>
+
+class ZEL_PLATFORM_EXPORT Orv
+{
+public:
+    using LogHandler = std::function<void(const char* line)>;
+
+    static void log(const char* line);
+    // Installs a handler (an empty one discards lines); returns the previous one.
+    static LogHandler setLogHandler(LogHandler handler);
+
+private:
+    Orv() = delete;
+};
+
+#endif

@@ -1,0 +1,137 @@
+#include "Orv_Engine.h"
+
+#include "Orv.h"
+#include "Orv_Request.h"
+#include "Orv_Result.h"
+#include "Orv_ResultQ.h"
+#include "Orv_ResultsCB.h"
+
+#include <exception>
+#include <string>
+
+Orv_Engine::Orv_Engine(unsigned workerCount)
+    : mResultQ(new Orv_ResultQ)
+{
+    if (workerCount == 0)
+        workerCount = 1;
+    mWorkers.reserve(workerCount);
+    for (unsigned i = 0; i < workerCount; ++i)
+        mWorkers.emplace_back(&Orv_Engine::workerLoop, this);
+}
+
+Orv_Engine::~Orv_Engine()
+{
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        mStopping = true;
+        mRequests.clear();
+    }
+    mWork.notify_all();
+    for (std::thread& worker : mWorkers)
+        worker.join();
+}
+
+void Orv_Engine::Submit(boost::shared_ptr<Orv_Request> request)
+{
+    if (!request)
+        return;
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        mRequests.push_back(std::move(request));
+    }
+    mWork.notify_one();
+}
+
+boost::shared_ptr<Orv_ResultQ> Orv_Engine::getResultQ() const
+{
+    return mResultQ;
+}
+
+std::size_t Orv_Engine::DeliverPending()
+{
+    std::size_t delivered = 0;
+    // Deliver only what is queued now, so that a result pushed during delivery
+    // waits for the next call rather than starving the caller.
+    for (std::size_t left = mResultQ->Size(); left > 0; --left) {
+        boost::shared_ptr<Orv_Result> result = mResultQ->TryPop();
+        if (!result)
+            break;
+        while (result->deliverNext()) {
+        }
+        if (result->isFinalResult() && result->getCallback())
+            result->getCallback()->setFinished(true);
+        ++delivered;
+    }
+    return delivered;
+}
+
+bool Orv_Engine::WaitForResults(std::chrono::milliseconds timeout)
+{
+    return mResultQ->WaitForResult(timeout);
+}
+
+void Orv_Engine::WaitIdle()
+{
+    std::unique_lock<std::mutex> lock(mMutex);
+    mIdle.wait(lock, [this] { return mRequests.empty() && mRunning == 0; });
+}
+
+std::size_t Orv_Engine::DeliverAll()
+{
+    std::size_t delivered = 0;
+    for (;;) {
+        WaitIdle();
+        if (mResultQ->Size() == 0)
+            break;
+        delivered += DeliverPending();
+    }
+    return delivered;
+}
+
+std::size_t Orv_Engine::failedRequestCount() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mFailed;
+}
+
+void Orv_Engine::workerLoop()
+{
+    std::unique_lock<std::mutex> lock(mMutex);
+    for (;;) {
+        mWork.wait(lock, [this] { return mStopping || !mRequests.empty(); });
+        if (mStopping)
+            return;
+        boost::shared_ptr<Orv_Request> request = std::move(mRequests.front());
+        mRequests.pop_front();
+        ++mRunning;
+        lock.unlock();
+        runRequest(request);
+        request.reset();
+        lock.lock();
+        --mRunning;
+        if (mRequests.empty() && mRunning == 0)
+            mIdle.notify_all();
+    }
+}
+
+void Orv_Engine::runRequest(const boost::shared_ptr<Orv_Request>& request)
+{
+    std::string failure;
+    try {
+        if (request->isCanceled())
+            mResultQ->Push(request->makeCanceledResult());
+        else
+            request->process(mResultQ);
+        return;
+    } catch (const std::exception& e) {
+        failure = e.what();
+    } catch (...) {
+        failure = "unknown exception";
+    }
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        ++mFailed;
+    }
+    const std::string line = "orv: request " + request->name() + " failed: " + failure;
+    Orv::log(line.c_str());
+}

@@ -1,0 +1,79 @@
+// Orv_Engine: a small request engine.
+//
+// Submit() queues a request; a fixed pool of worker threads runs each queued
+// request's process() with the engine's result queue, in submission order per
+// worker. Results are delivered on the thread that asks for it:
+// DeliverPending() pops every queued result and calls its deliverNext() until
+// it returns false, in push order. A request that is cancelled before it runs
+// is not processed; its makeCanceledResult(), if any, is queued instead.
+//
+//     Orv_Engine engine;                 // two worker threads
+//     engine.Submit(request);
+//     engine.DeliverAll();               // waits for the work, delivers the answers
+//
+// Submit, WaitIdle and the result queue are thread-safe. Delivery methods are
+// meant to be called from one thread at a time (the application's thread).
+// The destructor finishes the requests that are running, drops the ones still
+// queued, and joins the workers.
+#ifndef ORV_ENGINE_H
+#define ORV_ENGINE_H
+
+#include "zel_platform_export.h"
+
+#include <boost/shared_ptr.hpp>
+
+#include <chrono>
+#include <condition_variable>
+#include <cstddef>
+#include <deque>
+#include <mutex>
+#include <thread>
+#include <vector>
+
+class Orv_Request;
+class Orv_ResultQ;
+
+class ZEL_PLATFORM_EXPORT Orv_Engine
+{
+public:
+    explicit Orv_Engine(unsigned workerCount = 2);
+    ~Orv_Engine();
+
+    // Queues a request for a worker; an empty pointer is ignored.
+    void Submit(boost::shared_ptr<Orv_Request> request);
+    // The queue that every request and listener of this engine pushes onto.
+    boost::shared_ptr<Orv_ResultQ> getResultQ() const;
+
+    // Delivers every result queued now, each to its end; returns how many.
+    std::size_t DeliverPending();
+    // Blocks until a result is queued or the timeout has passed.
+    bool WaitForResults(std::chrono::milliseconds timeout);
+    // Blocks until no request is queued or running.
+    void WaitIdle();
+    // Waits and delivers until no request is queued or running and no result
+    // is left, including those of requests submitted during delivery.
+    std::size_t DeliverAll();
+
+    // Requests whose process() threw: the exception is logged through Orv::log.
+    std::size_t failedRequestCount() const;
+    unsigned workerCount() const { return static_cast<unsigned>(mWorkers.size()); }
+
+private:
+    Orv_Engine(const Orv_Engine&) = delete;
+    Orv_Engine& operator=(const Orv_Engine&) = delete;
+
+    void workerLoop();
+    void runRequest(const boost::shared_ptr<Orv_Request>& request);
+
+    boost::shared_ptr<Orv_ResultQ> mResultQ;
+    mutable std::mutex mMutex;
+    std::condition_variable mWork;
+    std::condition_variable mIdle;
+    std::deque<boost::shared_ptr<Orv_Request>> mRequests;
+    std::size_t mRunning = 0;
+    std::size_t mFailed = 0;
+    bool mStopping = false;
+    std::vector<std::thread> mWorkers;
+};
+
+#endif
