@@ -1,0 +1,184 @@
+#include "TraceCapture.h"
+#include "VtableSlot.h"
+
+#include "Zel_Debug.h"
+#include "Zel_Error.h"
+#include "Zel_Message.h"
+
+#include <QDateTime>
+#include <QRegularExpression>
+
+#include <gtest/gtest.h>
+
+#include <atomic>
+#include <set>
+#include <thread>
+#include <vector>
+
+namespace {
+
+// The debug output carries "[<date and time>]" before the line.
+QString stripStamp(const QString& qtLine)
+{
+    static const QRegularExpression stamp(QStringLiteral("^\\[([^\\]]*)\\]"));
+    const QRegularExpressionMatch match = stamp.match(qtLine);
+    if (!match.hasMatch())
+        return QStringLiteral("<no stamp>");
+    return qtLine.mid(match.capturedLength());
+}
+
+} // namespace
+
+TEST(Zel_DebugTest, WritesNothingWhileTracingIsOff)
+{
+    TraceCapture capture(false);
+    Zel_Debug::instance()->debug(QStringLiteral("Src"), QStringLiteral("text"), 15);
+    EXPECT_TRUE(capture.orvLines().empty());
+    EXPECT_TRUE(capture.qtLines().isEmpty());
+}
+
+TEST(Zel_DebugTest, FormatsSourceTextAndSecondsExactly)
+{
+    TraceCapture capture;
+    Zel_Debug& debug = *Zel_Debug::instance();
+    debug.debug(QStringLiteral("Zel_GetNodeReq"), QStringLiteral("processed request ID:12)"), 15);
+    debug.debug(QString(), QStringLiteral("only text"), 0);
+    debug.debug(QStringLiteral("OnlySource"), QString(), 0);
+    debug.debug(QString(), QString(), 0);
+    debug.debug(QString(), QString(), 1500);
+    debug.debug(QString(), QString(), -1500);
+    debug.debug(QStringLiteral("S"), QStringLiteral("t"), 1);
+    debug.debug(QStringLiteral("S"), QStringLiteral("t"), 123456789);
+
+    const std::vector<std::string> expected = {
+        "ZEL: Zel_GetNodeReq: processed request ID:12) (0.015 seconds)",
+        "ZEL: only text",
+        "ZEL: OnlySource:",
+        "ZEL:",
+        "ZEL: (1.5 seconds)",
+        "ZEL: (-1.5 seconds)",
+        "ZEL: S: t (0.001 seconds)",
+        "ZEL: S: t (123457 seconds)",
+    };
+    EXPECT_EQ(capture.orvLines(), expected);
+
+    const QStringList qtLines = capture.qtLines();
+    ASSERT_EQ(qtLines.size(), static_cast<int>(expected.size()));
+    for (int i = 0; i < qtLines.size(); ++i)
+        EXPECT_EQ(stripStamp(qtLines[i]).toStdString(), expected[i]) << "line " << i;
+}
+
+TEST(Zel_DebugTest, StampsDebugOutputWithTextDateOfNow)
+{
+    TraceCapture capture;
+    const QDateTime before = QDateTime::currentDateTime();
+    Zel_Debug::instance()->debug(QString(), QString(), 0);
+    const QDateTime after = QDateTime::currentDateTime();
+
+    ASSERT_EQ(capture.qtLines().size(), 1);
+    const QString line = capture.qtLines().first();
+    ASSERT_TRUE(line.startsWith(QLatin1Char('['))) << line.toStdString();
+    const int close = line.indexOf(QLatin1Char(']'));
+    ASSERT_GT(close, 0);
+    EXPECT_EQ(line.mid(close + 1), QStringLiteral("ZEL:"));
+    const QDateTime stamped = QDateTime::fromString(line.mid(1, close - 1), Qt::TextDate);
+    ASSERT_TRUE(stamped.isValid()) << line.toStdString();
+    // The text form has whole seconds only.
+    EXPECT_GE(stamped.toSecsSinceEpoch(), before.toSecsSinceEpoch());
+    EXPECT_LE(stamped.toSecsSinceEpoch(), after.toSecsSinceEpoch());
+}
+
+TEST(Zel_DebugTest, WritesPercentSignsAndLatin1Verbatim)
+{
+    TraceCapture capture;
+    const QString text = QStringLiteral("bin %s %d %% %n 100%") + QChar(0xE9);
+    Zel_Debug::instance()->debug(QStringLiteral("%1"), text, 0);
+
+    ASSERT_EQ(capture.orvLines().size(), 1u);
+    const QByteArray expectedLatin1 = (QStringLiteral("ZEL: %1: ") + text).toLatin1();
+    EXPECT_EQ(capture.orvLines()[0], expectedLatin1.toStdString());
+    EXPECT_EQ(static_cast<unsigned char>(capture.orvLines()[0].back()), 0xE9u);
+    ASSERT_EQ(capture.qtLines().size(), 1);
+    EXPECT_TRUE(capture.qtLines()[0].endsWith(QStringLiteral("ZEL: %1: bin %s %d %% %n 100%") + QChar(0xE9)));
+}
+
+TEST(Zel_DebugTest, InstanceIsOneObjectEvenUnderConcurrentFirstCalls)
+{
+    std::vector<std::thread> threads;
+    std::vector<Zel_Debug*> seen(8, nullptr);
+    std::atomic<bool> go(false);
+    for (int i = 0; i < 8; ++i) {
+        threads.emplace_back([&, i] {
+            while (!go.load()) {
+            }
+            seen[i] = Zel_Debug::instance().get();
+        });
+    }
+    go = true;
+    for (std::thread& t : threads)
+        t.join();
+    const std::set<Zel_Debug*> distinct(seen.begin(), seen.end());
+    EXPECT_EQ(distinct.size(), 1u);
+    EXPECT_NE(*distinct.begin(), nullptr);
+    EXPECT_EQ(*distinct.begin(), Zel_Debug::instance().get());
+}
+
+TEST(Zel_DebugTest, CopyKeepsSwitchButNotIdentity)
+{
+    TraceCapture capture(true);
+    Zel_Debug copy(*Zel_Debug::instance());
+    EXPECT_TRUE(copy.getEnabled());
+    copy.setEnabled(false);
+    EXPECT_TRUE(Zel_Debug::instance()->getEnabled());
+}
+
+TEST(Zel_ErrorTest, MinusOneAloneMeansNoError)
+{
+    EXPECT_FALSE(Zel_Error().isError());
+    EXPECT_EQ(Zel_Error().getCode(), -1);
+    EXPECT_TRUE(Zel_Error().getMsg().isEmpty());
+    EXPECT_TRUE(Zel_Error(0, QString()).isError());
+    EXPECT_TRUE(Zel_Error(42, QStringLiteral("x")).isError());
+    EXPECT_TRUE(Zel_Error(-2, QStringLiteral("x")).isError());
+    EXPECT_FALSE(Zel_Error(-1, QStringLiteral("message but no error")).isError());
+    EXPECT_FALSE(Zel_Error(13, QStringLiteral("denied")).isPrivilegeError());
+
+    Zel_Error error(5, QStringLiteral("five"));
+    error.setCode(-1);
+    EXPECT_FALSE(error.isError());
+    Zel_Error& self = error;
+    error = self;
+    EXPECT_EQ(error.getMsg(), QStringLiteral("five"));
+}
+
+TEST(Zel_ErrorTest, ClassifiesThroughOverriddenCode)
+{
+    struct AlwaysOk : Zel_Error {
+        AlwaysOk() : Zel_Error(7, QStringLiteral("stored")) {}
+        const int getCode() const override { return -1; }
+        bool isPrivilegeError() const override { return true; }
+    };
+    const AlwaysOk ok;
+    const Zel_Error& asBase = ok;
+    EXPECT_FALSE(asBase.isError());
+    EXPECT_TRUE(asBase.isPrivilegeError());
+}
+
+TEST(Zel_ErrorTest, VirtualSlotsInDeclaredOrder)
+{
+    EXPECT_EQ(vtableSlot(&Zel_Error::setMsg), 2);
+    EXPECT_EQ(vtableSlot(&Zel_Error::getMsg), 3);
+    EXPECT_EQ(vtableSlot(&Zel_Error::setCode), 4);
+    EXPECT_EQ(vtableSlot(&Zel_Error::getCode), 5);
+    EXPECT_EQ(vtableSlot(&Zel_Error::isError), 6);
+    EXPECT_EQ(vtableSlot(&Zel_Error::isPrivilegeError), 7);
+}
+
+TEST(Zel_MessageTest, HoldsItsText)
+{
+    const Zel_Message message(QStringLiteral("hello"));
+    Zel_Message copy;
+    EXPECT_TRUE(static_cast<QString>(copy).isNull());
+    copy = message;
+    EXPECT_EQ(static_cast<QString>(copy), QStringLiteral("hello"));
+}

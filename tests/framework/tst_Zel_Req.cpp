@@ -1,0 +1,228 @@
+#include "TraceCapture.h"
+#include "VtableSlot.h"
+
+#include "Orv_ResultQ.h"
+#include "Orv_ResultsCB.h"
+#include "Zel_Req.h"
+#include "Zel_Res.h"
+
+#include <boost/make_shared.hpp>
+#include <gtest/gtest.h>
+
+#include <chrono>
+#include <stdexcept>
+#include <thread>
+
+namespace {
+
+struct NullCB : Orv_ResultsCB {
+    NullCB() : Orv_ResultsCB(Orv_RequestID(Orv_RequestID::Callback)) {}
+};
+
+struct EmptyRes : Zel_Res {
+    EmptyRes() : Zel_Res(boost::make_shared<NullCB>(), true) {}
+    bool haveResults() override { return false; }
+    bool isCurrentResultError() override { return true; }
+    void doFailed() override {}
+    void doSucceeded() override {}
+    void doFinished() override {}
+};
+
+// A request whose work is a function given by the test.
+struct ScriptedReq : Zel_Req {
+    explicit ScriptedReq(QString name, std::function<bool(boost::shared_ptr<Orv_Result>&)> work)
+        : Zel_Req(std::move(name), boost::make_shared<NullCB>())
+        , mWork(std::move(work))
+    {
+    }
+    bool doProcess(boost::shared_ptr<Orv_Result>& result) override
+    {
+        ++mRuns;
+        return mWork(result);
+    }
+    boost::shared_ptr<Orv_ResultQ> queue() const { return getORVResultQ(); }
+
+    std::function<bool(boost::shared_ptr<Orv_Result>&)> mWork;
+    int mRuns = 0;
+};
+
+// Exposes the protected slots so that their positions can be checked.
+struct SlotProbe : Zel_Req {
+    static std::ptrdiff_t makeCanceledResultSlot() { return vtableSlot(&SlotProbe::makeCanceledResult); }
+    static std::ptrdiff_t setCanceledSlot() { return vtableSlot(&SlotProbe::setCanceled); }
+};
+
+std::string idText(const Zel_Req& request)
+{
+    return " ID:" + std::to_string(request.getRequestID().getValue()) + ")";
+}
+
+} // namespace
+
+TEST(Zel_ReqTest, TracesStartAndEndAroundWorkAndPushesTheResult)
+{
+    TraceCapture capture;
+    const boost::shared_ptr<Orv_Result> produced = boost::make_shared<EmptyRes>();
+    ScriptedReq request(QStringLiteral("Zel_GetNodeReq"), [&](boost::shared_ptr<Orv_Result>& result) {
+        std::this_thread::sleep_for(std::chrono::milliseconds(20));
+        result = produced;
+        return true;
+    });
+    const boost::shared_ptr<Orv_ResultQ> queue = boost::make_shared<Orv_ResultQ>();
+
+    EXPECT_TRUE(request.process(queue));
+    EXPECT_EQ(request.mRuns, 1);
+    EXPECT_EQ(request.queue(), queue);
+    ASSERT_EQ(queue->Size(), 1u);
+    EXPECT_EQ(queue->TryPop(), produced);
+
+    const std::vector<std::string> lines = capture.orvLines();
+    ASSERT_EQ(lines.size(), 2u);
+    EXPECT_EQ(lines[0], "ZEL: Zel_GetNodeReq: processing request" + idText(request));
+    const std::string prefix = "ZEL: Zel_GetNodeReq: processed request" + idText(request) + " (";
+    ASSERT_EQ(lines[1].compare(0, prefix.size(), prefix), 0) << lines[1];
+    ASSERT_EQ(lines[1].substr(lines[1].size() - 9), " seconds)") << lines[1];
+    const double seconds = std::stod(lines[1].substr(prefix.size()));
+    EXPECT_GE(seconds, 0.02);
+    EXPECT_LT(seconds, 10.0);
+    EXPECT_EQ(capture.qtLines().size(), 2);
+}
+
+TEST(Zel_ReqTest, RequestNumbersAreDistinctAndIncreasing)
+{
+    ScriptedReq first(QStringLiteral("A"), [](boost::shared_ptr<Orv_Result>&) { return false; });
+    ScriptedReq second(QStringLiteral("B"), [](boost::shared_ptr<Orv_Result>&) { return false; });
+    EXPECT_GT(first.getRequestID().getValue(), 0);
+    EXPECT_GT(second.getRequestID().getValue(), first.getRequestID().getValue());
+}
+
+TEST(Zel_ReqTest, EmptyQueueSkipsWorkButStillTraces)
+{
+    TraceCapture capture;
+    ScriptedReq request(QStringLiteral("R"), [](boost::shared_ptr<Orv_Result>&) { return true; });
+    EXPECT_FALSE(request.process(boost::shared_ptr<Orv_ResultQ>()));
+    EXPECT_EQ(request.mRuns, 0);
+    const std::vector<std::string> lines = capture.orvLines();
+    ASSERT_EQ(lines.size(), 2u);
+    EXPECT_EQ(lines[0], "ZEL: R: processing request" + idText(request));
+    EXPECT_EQ(lines[1], "ZEL: R: processed request" + idText(request));
+}
+
+TEST(Zel_ReqTest, WorkWithoutResultPushesNothingAndPassesItsAnswer)
+{
+    TraceCapture capture(false);
+    const boost::shared_ptr<Orv_ResultQ> queue = boost::make_shared<Orv_ResultQ>();
+    ScriptedReq yes(QStringLiteral("Y"), [](boost::shared_ptr<Orv_Result>&) { return true; });
+    ScriptedReq no(QStringLiteral("N"), [](boost::shared_ptr<Orv_Result>&) { return false; });
+    EXPECT_TRUE(yes.process(queue));
+    EXPECT_FALSE(no.process(queue));
+    EXPECT_EQ(queue->Size(), 0u);
+
+    // A result with answer false is still pushed.
+    ScriptedReq falseWithResult(QStringLiteral("F"), [](boost::shared_ptr<Orv_Result>& result) {
+        result = boost::make_shared<EmptyRes>();
+        return false;
+    });
+    EXPECT_FALSE(falseWithResult.process(queue));
+    EXPECT_EQ(queue->Size(), 1u);
+    EXPECT_TRUE(capture.orvLines().empty());
+    EXPECT_TRUE(capture.qtLines().isEmpty());
+}
+
+TEST(Zel_ReqTest, TracingSwitchedOnDuringWorkWritesOnlyTheClosingLineWithoutId)
+{
+    TraceCapture capture(false);
+    ScriptedReq request(QStringLiteral("Toggle"), [](boost::shared_ptr<Orv_Result>&) {
+        Zel_Debug::instance()->setEnabled(true);
+        return true;
+    });
+    request.process(boost::make_shared<Orv_ResultQ>());
+    const std::vector<std::string> lines = capture.orvLines();
+    ASSERT_EQ(lines.size(), 1u);
+    EXPECT_EQ(lines[0], "ZEL: Toggle: processed request");
+}
+
+TEST(Zel_ReqTest, TracingSwitchedOffDuringWorkWritesOnlyTheOpeningLine)
+{
+    TraceCapture capture(true);
+    ScriptedReq request(QStringLiteral("Toggle"), [](boost::shared_ptr<Orv_Result>&) {
+        Zel_Debug::instance()->setEnabled(false);
+        return true;
+    });
+    request.process(boost::make_shared<Orv_ResultQ>());
+    const std::vector<std::string> lines = capture.orvLines();
+    ASSERT_EQ(lines.size(), 1u);
+    EXPECT_EQ(lines[0], "ZEL: Toggle: processing request" + idText(request));
+}
+
+TEST(Zel_ReqTest, EmptyNameLeavesSourceOut)
+{
+    TraceCapture capture;
+    ScriptedReq request(QString(), [](boost::shared_ptr<Orv_Result>&) { return true; });
+    EXPECT_TRUE(request.getName().isEmpty());
+    request.process(boost::make_shared<Orv_ResultQ>());
+    ASSERT_EQ(capture.orvLines().size(), 2u);
+    EXPECT_EQ(capture.orvLines()[0], "ZEL: processing request" + idText(request));
+}
+
+TEST(Zel_ReqTest, ExceptionFromWorkPassesThroughAndNothingIsPushed)
+{
+    TraceCapture capture;
+    const boost::shared_ptr<Orv_ResultQ> queue = boost::make_shared<Orv_ResultQ>();
+    ScriptedReq request(QStringLiteral("Thrower"), [](boost::shared_ptr<Orv_Result>& result) -> bool {
+        result = boost::make_shared<EmptyRes>();
+        throw std::runtime_error("work failed");
+    });
+    EXPECT_THROW(request.process(queue), std::runtime_error);
+    EXPECT_EQ(queue->Size(), 0u);
+    ASSERT_EQ(capture.orvLines().size(), 1u); // the closing line is never reached
+}
+
+TEST(Zel_ReqTest, ProcessingAgainRunsTheWorkAgainOnTheNewQueue)
+{
+    ScriptedReq request(QStringLiteral("Again"), [](boost::shared_ptr<Orv_Result>& result) {
+        result = boost::make_shared<EmptyRes>();
+        return true;
+    });
+    const boost::shared_ptr<Orv_ResultQ> first = boost::make_shared<Orv_ResultQ>();
+    const boost::shared_ptr<Orv_ResultQ> second = boost::make_shared<Orv_ResultQ>();
+    request.process(first);
+    request.process(second);
+    EXPECT_EQ(request.mRuns, 2);
+    EXPECT_EQ(first->Size(), 1u);
+    EXPECT_EQ(second->Size(), 1u);
+    EXPECT_EQ(request.queue(), second);
+}
+
+TEST(Zel_ReqTest, DefaultRequestHasEmptyNameAndNoCallback)
+{
+    struct Bare : Zel_Req {
+        bool doProcess(boost::shared_ptr<Orv_Result>&) override { return false; }
+    } bare;
+    EXPECT_TRUE(bare.getName().isEmpty());
+    EXPECT_FALSE(bare.getCallback());
+}
+
+TEST(Zel_ReqTest, VirtualSlotsInDeclaredOrder)
+{
+    EXPECT_EQ(vtableSlot(&Orv_Request::name), 2);
+    EXPECT_EQ(vtableSlot(&Orv_Request::getRequestID), 3);
+    EXPECT_EQ(vtableSlot(&Orv_Request::isCanceled), 4);
+    EXPECT_EQ(vtableSlot(&Zel_Req::process), 5);
+    EXPECT_EQ(SlotProbe::makeCanceledResultSlot(), 6);
+    EXPECT_EQ(SlotProbe::setCanceledSlot(), 7);
+    EXPECT_EQ(vtableSlot(&Zel_Req::getName), 8);
+    EXPECT_EQ(vtableSlot(&Zel_Req::doProcess), 9);
+
+    EXPECT_EQ(vtableSlot(&Orv_Result::getRequestID), 2);
+    EXPECT_EQ(vtableSlot(&Orv_Result::isFinalResult), 3);
+    EXPECT_EQ(vtableSlot(&Zel_Res::deliverNext), 4);
+    EXPECT_EQ(vtableSlot(&Zel_Res::haveResults), 5);
+    EXPECT_EQ(vtableSlot(&Zel_Res::isCurrentResultError), 6);
+    EXPECT_EQ(vtableSlot(&Zel_Res::doFailed), 7);
+    EXPECT_EQ(vtableSlot(&Zel_Res::doSucceeded), 8);
+    EXPECT_EQ(vtableSlot(&Zel_Res::doFinished), 9);
+
+    EXPECT_EQ(vtableSlot(&Orv_ResultsCB::cancelRequest), 2);
+    EXPECT_EQ(vtableSlot(&Orv_ResultsCB::isFinished), 3);
+}

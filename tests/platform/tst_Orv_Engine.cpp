@@ -1,0 +1,209 @@
+#include "Orv.h"
+#include "Orv_Engine.h"
+#include "Orv_Request.h"
+#include "Orv_Result.h"
+#include "Orv_ResultQ.h"
+#include "Orv_ResultsCB.h"
+#include "Threads_Mutex.h"
+#include "Threads_MutexTenure.h"
+
+#include <boost/make_shared.hpp>
+#include <gtest/gtest.h>
+
+#include <atomic>
+#include <mutex>
+#include <stdexcept>
+#include <string>
+#include <thread>
+#include <vector>
+
+namespace {
+
+struct LogCB : Orv_ResultsCB {
+    LogCB() : Orv_ResultsCB(Orv_RequestID(Orv_RequestID::Callback)) {}
+    std::vector<std::string> delivered; // only touched on the delivering thread
+};
+
+// A result that hands `count` numbered items to its callback, one per call.
+struct CountingResult : Orv_Result {
+    CountingResult(boost::shared_ptr<LogCB> cb, std::string tag, int count, bool final)
+        : Orv_Result(cb, final), mCB(std::move(cb)), mTag(std::move(tag)), mCount(count) {}
+    bool deliverNext() override
+    {
+        if (mNext < mCount)
+            mCB->delivered.push_back(mTag + ":" + std::to_string(mNext++));
+        return mNext < mCount;
+    }
+    boost::shared_ptr<LogCB> mCB;
+    std::string mTag;
+    int mCount;
+    int mNext = 0;
+};
+
+struct PushingRequest : Orv_Request {
+    PushingRequest(boost::shared_ptr<LogCB> cb, std::string tag, int results)
+        : Orv_Request("PushingRequest", cb), mCB(std::move(cb)), mTag(std::move(tag)), mResults(results) {}
+    bool process(boost::shared_ptr<Orv_ResultQ> q) override
+    {
+        ++mProcessed;
+        for (int i = 0; i < mResults; ++i)
+            q->Push(boost::make_shared<CountingResult>(mCB, mTag + "/" + std::to_string(i), 2, i + 1 == mResults));
+        return true;
+    }
+    void cancel() { setCanceled(true); }
+    boost::shared_ptr<LogCB> mCB;
+    std::string mTag;
+    int mResults;
+    std::atomic<int> mProcessed{0};
+};
+
+} // namespace
+
+TEST(Orv_EngineTest, DeliversEveryItemOfEveryResultInPushOrder)
+{
+    Orv_Engine engine(3);
+    auto cb = boost::make_shared<LogCB>();
+    std::vector<boost::shared_ptr<PushingRequest>> requests;
+    for (int i = 0; i < 50; ++i) {
+        requests.push_back(boost::make_shared<PushingRequest>(cb, "r" + std::to_string(i), 3));
+        engine.Submit(requests.back());
+    }
+    engine.DeliverAll();
+
+    ASSERT_EQ(cb->delivered.size(), 50u * 3u * 2u);
+    // Within one request its results arrive in push order, each item in order.
+    for (int i = 0; i < 50; ++i) {
+        const std::string tag = "r" + std::to_string(i) + "/";
+        std::vector<std::string> mine;
+        for (const std::string& d : cb->delivered)
+            if (d.compare(0, tag.size(), tag) == 0)
+                mine.push_back(d.substr(tag.size()));
+        EXPECT_EQ(mine, (std::vector<std::string>{"0:0", "0:1", "1:0", "1:1", "2:0", "2:1"})) << tag;
+        EXPECT_EQ(requests[i]->mProcessed.load(), 1);
+    }
+    EXPECT_TRUE(cb->isFinished());
+    EXPECT_EQ(engine.getResultQ()->Size(), 0u);
+}
+
+TEST(Orv_EngineTest, ResultsPushedFromManyThreadsComeOutInPushOrder)
+{
+    Orv_ResultQ queue;
+    auto cb = boost::make_shared<LogCB>();
+    std::mutex orderMutex;
+    std::vector<boost::shared_ptr<Orv_Result>> pushed;
+    std::vector<std::thread> threads;
+    for (int t = 0; t < 4; ++t) {
+        threads.emplace_back([&, t] {
+            for (int i = 0; i < 200; ++i) {
+                auto r = boost::make_shared<CountingResult>(cb, std::to_string(t), 1, false);
+                std::lock_guard<std::mutex> lock(orderMutex);
+                pushed.push_back(r);
+                queue.Push(r);
+            }
+        });
+    }
+    for (std::thread& t : threads)
+        t.join();
+    ASSERT_EQ(queue.Size(), 800u);
+    for (const boost::shared_ptr<Orv_Result>& expected : pushed)
+        EXPECT_EQ(queue.TryPop(), expected);
+    EXPECT_FALSE(queue.TryPop());
+    queue.Push(boost::shared_ptr<Orv_Result>());
+    EXPECT_EQ(queue.Size(), 0u) << "empty results are ignored";
+}
+
+TEST(Orv_EngineTest, CancelledRequestsAreNotProcessed)
+{
+    Orv_Engine engine(1);
+    auto cb = boost::make_shared<LogCB>();
+    auto byRequest = boost::make_shared<PushingRequest>(cb, "a", 1);
+    byRequest->cancel();
+    auto cancelledCB = boost::make_shared<LogCB>();
+    auto byCallback = boost::make_shared<PushingRequest>(cancelledCB, "b", 1);
+    EXPECT_TRUE(cancelledCB->cancelRequest());
+    EXPECT_TRUE(byCallback->isCanceled());
+    engine.Submit(byRequest);
+    engine.Submit(byCallback);
+    engine.DeliverAll();
+    EXPECT_EQ(byRequest->mProcessed.load(), 0);
+    EXPECT_EQ(byCallback->mProcessed.load(), 0);
+    EXPECT_TRUE(cb->delivered.empty());
+
+    // A finished request can no longer be cancelled.
+    auto doneCB = boost::make_shared<LogCB>();
+    engine.Submit(boost::make_shared<PushingRequest>(doneCB, "c", 1));
+    engine.DeliverAll();
+    EXPECT_TRUE(doneCB->isFinished());
+    EXPECT_FALSE(doneCB->cancelRequest());
+}
+
+TEST(Orv_EngineTest, ThrowingRequestIsLoggedAndCounted)
+{
+    struct Thrower : Orv_Request {
+        Thrower() : Orv_Request("Thrower", boost::shared_ptr<Orv_ResultsCB>()) {}
+        bool process(boost::shared_ptr<Orv_ResultQ>) override { throw std::runtime_error("boom"); }
+    };
+    std::vector<std::string> lines;
+    std::mutex linesMutex;
+    const Orv::LogHandler previous = Orv::setLogHandler([&](const char* line) {
+        std::lock_guard<std::mutex> lock(linesMutex);
+        lines.push_back(line);
+    });
+    {
+        Orv_Engine engine(2);
+        engine.Submit(boost::make_shared<Thrower>());
+        engine.WaitIdle();
+        EXPECT_EQ(engine.failedRequestCount(), 1u);
+    }
+    Orv::setLogHandler(previous);
+    ASSERT_EQ(lines.size(), 1u);
+    EXPECT_EQ(lines[0], "orv: request Thrower failed: boom");
+}
+
+TEST(Orv_EngineTest, LogWithoutHandlerDiscardsAndHandlerCanBeReplaced)
+{
+    const Orv::LogHandler previous = Orv::setLogHandler(Orv::LogHandler());
+    Orv::log("dropped");
+    Orv::log(nullptr);
+    std::vector<std::string> seen;
+    Orv::setLogHandler([&](const char* line) { seen.push_back(line); });
+    Orv::log("kept");
+    Orv::setLogHandler(previous);
+    EXPECT_EQ(seen, (std::vector<std::string>{"kept"}));
+}
+
+TEST(Orv_EngineTest, DestroyingEngineWithQueuedWorkJoinsCleanly)
+{
+    auto cb = boost::make_shared<LogCB>();
+    std::vector<boost::shared_ptr<PushingRequest>> requests;
+    {
+        Orv_Engine engine(1);
+        for (int i = 0; i < 100; ++i) {
+            requests.push_back(boost::make_shared<PushingRequest>(cb, "x", 1));
+            engine.Submit(requests.back());
+        }
+    }
+    int processed = 0;
+    for (const auto& r : requests)
+        processed += r->mProcessed.load();
+    EXPECT_LE(processed, 100);
+    for (const auto& r : requests)
+        EXPECT_LE(r->mProcessed.load(), 1);
+}
+
+TEST(Threads_MutexTest, IsRecursiveAndExcludesOtherThreads)
+{
+    Threads::Mutex mutex("Test Mutex", false);
+    EXPECT_EQ(mutex.name(), "Test Mutex");
+    std::atomic<bool> otherGotIn(false);
+    {
+        Threads::MutexTenure outer(mutex, nullptr);
+        Threads::MutexTenure inner(mutex, "again"); // same thread: no deadlock
+        std::thread other([&] { otherGotIn = mutex.try_lock(); if (otherGotIn) mutex.unlock(); });
+        other.join();
+    }
+    EXPECT_FALSE(otherGotIn.load());
+    std::thread after([&] { otherGotIn = mutex.try_lock(); if (otherGotIn) mutex.unlock(); });
+    after.join();
+    EXPECT_TRUE(otherGotIn.load());
+}
