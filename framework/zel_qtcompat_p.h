@@ -14,10 +14,16 @@ namespace ZelCompat {
 using ElapsedTimer = QElapsedTimer;
 
 // Whole seconds since 1970-01-01 00:00 UTC as an unsigned 32-bit number, as
-// QDateTime::toTime_t gave it (removed in Qt 6).
+// QDateTime::toTime_t gave it (removed in Qt 6): uint(-1) for an invalid
+// moment or one outside that range, rather than a wrapped number.
 inline uint toTimeT(const QDateTime& dateTime)
 {
-    return static_cast<uint>(dateTime.toSecsSinceEpoch());
+    if (!dateTime.isValid())
+        return uint(-1);
+    const qint64 seconds = dateTime.toSecsSinceEpoch();
+    if (seconds < 0 || seconds > qint64(0xFFFFFFFEu))
+        return uint(-1);
+    return static_cast<uint>(seconds);
 }
 
 // The regular expression class of name validation (Qt 6: Core5Compat).
