@@ -1,0 +1,38 @@
+// Zel_CreateFolderCB: the callback of Zel_CreateFolderReq. The answer is the
+// folder created.
+//
+// The application derives from it, implements the handlers and gives it, under
+// a boost::shared_ptr, to the request. The request is answered by a result
+// class of the backend, which calls one handler per answer (failed for an
+// error record that reports an error, finished after the last answer of the
+// request) on the engine's delivery thread.
+#ifndef ZEL_CREATEFOLDERCB_H
+#define ZEL_CREATEFOLDERCB_H
+
+#include "zel_export.h"
+#include "Orv_ResultsCB.h"
+
+#include <boost/shared_ptr.hpp>
+
+class Zel_Error;
+class Zel_Node;
+
+class ZEL_EXPORT Zel_CreateFolderCB : public Orv_ResultsCB
+{
+public:
+    Zel_CreateFolderCB();
+    Zel_CreateFolderCB(const Zel_CreateFolderCB& other);
+    virtual ~Zel_CreateFolderCB();
+
+    // One answer: the folder created.
+    virtual void succeeded(boost::shared_ptr<Zel_Node> folder) = 0;
+    // One answer that is an error: its error record.
+    virtual void failed(boost::shared_ptr<Zel_Error> error) = 0;
+    // The request has delivered its last answer.
+    virtual void finished() = 0;
+
+private:
+    Zel_CreateFolderCB& operator=(const Zel_CreateFolderCB&) = delete;
+};
+
+#endif

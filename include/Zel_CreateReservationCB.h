@@ -1,0 +1,37 @@
+// Zel_CreateReservationCB: the callback of Zel_CreateReservationReq, answered
+// by Zel_CreateReservationRes. Each answer only says whether the reservation
+// was made.
+//
+// The application derives from it, implements the handlers and gives it, under
+// a boost::shared_ptr, to the request; the result calls one handler per answer
+// on the engine's delivery thread and catches and discards any exception a
+// handler throws. The callback lives as long as a result holds it.
+#ifndef ZEL_CREATERESERVATIONCB_H
+#define ZEL_CREATERESERVATIONCB_H
+
+#include "zel_export.h"
+#include "Orv_ResultsCB.h"
+
+#include <boost/shared_ptr.hpp>
+
+class Zel_Error;
+
+class ZEL_EXPORT Zel_CreateReservationCB : public Orv_ResultsCB
+{
+public:
+    Zel_CreateReservationCB();
+    Zel_CreateReservationCB(const Zel_CreateReservationCB& other);
+    virtual ~Zel_CreateReservationCB();
+
+    // One answer: the reservation was made.
+    virtual void succeeded() = 0;
+    // One answer that is an error: its error record.
+    virtual void failed(boost::shared_ptr<Zel_Error> error) = 0;
+    // The request has delivered its last answer.
+    virtual void finished() = 0;
+
+private:
+    Zel_CreateReservationCB& operator=(const Zel_CreateReservationCB&) = delete;
+};
+
+#endif
