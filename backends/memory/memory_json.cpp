@@ -1,0 +1,630 @@
+// Loading the tree from JSON and saving it back, with Qt's JSON classes.
+//
+// Syntax errors are reported as "FILE:LINE:COLUMN: message" (the parser's
+// byte offset turned into a line and a character column); every other
+// problem as "FILE: PATH: message", where PATH names the offending value the
+// way one would write it in code (root.children[2].name).
+#include "memory_tree_p.h"
+
+#include "Zel_MimeTypeSpec.h"
+#include "Zel_MimeTypeValue.h"
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QJsonParseError>
+#include <QJsonValue>
+#include <QSet>
+
+namespace ZelMemory {
+
+namespace {
+
+const char* const kFormat = "zel-memory-tree";
+const QString kMonikerPrefix = QStringLiteral("zel-mem://");
+
+struct Failure {
+    QString message;
+};
+
+class Reader
+{
+public:
+    Reader(Tree& tree, const QString& source)
+        : mTree(tree)
+        , mSource(source)
+    {
+    }
+
+    void read(const QJsonObject& top)
+    {
+        const QString format = optString(top, QStringLiteral("format"), QStringLiteral("format"), QString());
+        if (!format.isEmpty() && format != QLatin1String(kFormat))
+            fail(QStringLiteral("format"), QStringLiteral("expected \"%1\", found \"%2\"").arg(QLatin1String(kFormat), format));
+        mTree.serverName = optString(top, QStringLiteral("server"), QStringLiteral("server"), QStringLiteral("Zel Memory Server"));
+        readUsers(top);
+        readKeys(top);
+        readResolutions(top);
+        readSettings(top);
+        if (!top.value(QStringLiteral("root")).isObject())
+            fail(QStringLiteral("root"), QStringLiteral("missing or not an object (the tree's root node)"));
+        Node& root = readNode(top.value(QStringLiteral("root")).toObject(), QStringLiteral("root"), nullptr);
+        if (!Zel_MimeTypeSpec(0x7E00).isType(root.mimeType))
+            fail(QStringLiteral("root.mimeType"), QStringLiteral("the root must be a container (project, bin, folder, catalog, workspace), not \"%1\"").arg(root.mimeType));
+        mTree.rootId = root.id;
+        resolveReferences();
+        readLinkedProjects(top);
+    }
+
+private:
+    [[noreturn]] void fail(const QString& path, const QString& message)
+    {
+        throw Failure{mSource + QStringLiteral(": ") + path + QStringLiteral(": ") + message};
+    }
+
+    QString optString(const QJsonObject& object, const QString& key, const QString& path, const QString& fallback)
+    {
+        const QJsonValue value = object.value(key);
+        if (value.isUndefined() || value.isNull())
+            return fallback;
+        if (!value.isString())
+            fail(path, QStringLiteral("expected a string"));
+        return value.toString();
+    }
+
+    QString reqString(const QJsonObject& object, const QString& key, const QString& path)
+    {
+        const QJsonValue value = object.value(key);
+        if (value.isUndefined())
+            fail(path, QStringLiteral("missing"));
+        if (!value.isString())
+            fail(path, QStringLiteral("expected a string"));
+        if (value.toString().isEmpty())
+            fail(path, QStringLiteral("must not be empty"));
+        return value.toString();
+    }
+
+    bool optBool(const QJsonObject& object, const QString& key, const QString& path, bool fallback)
+    {
+        const QJsonValue value = object.value(key);
+        if (value.isUndefined() || value.isNull())
+            return fallback;
+        if (!value.isBool())
+            fail(path, QStringLiteral("expected true or false"));
+        return value.toBool();
+    }
+
+    int optInt(const QJsonObject& object, const QString& key, const QString& path, int fallback)
+    {
+        const QJsonValue value = object.value(key);
+        if (value.isUndefined() || value.isNull())
+            return fallback;
+        if (!value.isDouble() || value.toDouble() != static_cast<double>(value.toInt()))
+            fail(path, QStringLiteral("expected a whole number"));
+        return value.toInt();
+    }
+
+    QDateTime optDate(const QJsonObject& object, const QString& key, const QString& path)
+    {
+        const QString text = optString(object, key, path, QString());
+        if (text.isEmpty())
+            return QDateTime();
+        QDateTime date = QDateTime::fromString(text, Qt::ISODate);
+        if (!date.isValid())
+            fail(path, QStringLiteral("\"%1\" is not an ISO 8601 date and time").arg(text));
+        return date.toUTC();
+    }
+
+    QJsonArray optArray(const QJsonObject& object, const QString& key, const QString& path)
+    {
+        const QJsonValue value = object.value(key);
+        if (value.isUndefined() || value.isNull())
+            return QJsonArray();
+        if (!value.isArray())
+            fail(path, QStringLiteral("expected an array"));
+        return value.toArray();
+    }
+
+    QJsonObject optObject(const QJsonObject& object, const QString& key, const QString& path)
+    {
+        const QJsonValue value = object.value(key);
+        if (value.isUndefined() || value.isNull())
+            return QJsonObject();
+        if (!value.isObject())
+            fail(path, QStringLiteral("expected an object"));
+        return value.toObject();
+    }
+
+    QJsonObject element(const QJsonArray& array, int i, const QString& path)
+    {
+        if (!array.at(i).isObject())
+            fail(path, QStringLiteral("expected an object"));
+        return array.at(i).toObject();
+    }
+
+    static QString at(const QString& path, int i) { return path + QLatin1Char('[') + QString::number(i) + QLatin1Char(']'); }
+    static QString dot(const QString& path, const QString& key) { return path + QLatin1Char('.') + key; }
+
+    SettingPairs readPairs(const QJsonObject& object, const QString& path)
+    {
+        SettingPairs pairs;
+        for (auto it = object.begin(); it != object.end(); ++it) {
+            if (!it.value().isString())
+                fail(dot(path, it.key()), QStringLiteral("expected a string"));
+            pairs.append(qMakePair(it.key(), it.value().toString()));
+        }
+        return pairs;
+    }
+
+    void readUsers(const QJsonObject& top)
+    {
+        const QJsonArray users = optArray(top, QStringLiteral("users"), QStringLiteral("users"));
+        for (int i = 0; i < users.size(); ++i) {
+            const QString path = at(QStringLiteral("users"), i);
+            const QJsonObject o = element(users, i, path);
+            User user;
+            user.name = reqString(o, QStringLiteral("name"), dot(path, QStringLiteral("name")));
+            if (user.name == QLatin1String("*"))
+                fail(dot(path, QStringLiteral("name")), QStringLiteral("\"*\" stands for every user and cannot be a user's name"));
+            if (mTree.user(user.name))
+                fail(dot(path, QStringLiteral("name")), QStringLiteral("a second user named \"%1\"").arg(user.name));
+            user.password = optString(o, QStringLiteral("password"), dot(path, QStringLiteral("password")), QString());
+            user.fullName = optString(o, QStringLiteral("fullName"), dot(path, QStringLiteral("fullName")), user.name);
+            user.admin = optBool(o, QStringLiteral("admin"), dot(path, QStringLiteral("admin")), false);
+            mTree.users.append(user);
+        }
+    }
+
+    void readKeys(const QJsonObject& top)
+    {
+        const QJsonArray keys = optArray(top, QStringLiteral("propertyKeys"), QStringLiteral("propertyKeys"));
+        for (int i = 0; i < keys.size(); ++i) {
+            const QString path = at(QStringLiteral("propertyKeys"), i);
+            const QJsonObject o = element(keys, i, path);
+            KeyDesc key;
+            key.key = reqString(o, QStringLiteral("key"), dot(path, QStringLiteral("key")));
+            if (mTree.key(key.key))
+                fail(dot(path, QStringLiteral("key")), QStringLiteral("a second description of the key \"%1\"").arg(key.key));
+            key.displayName = optString(o, QStringLiteral("displayName"), dot(path, QStringLiteral("displayName")), key.key);
+            key.internalName = optString(o, QStringLiteral("internalName"), dot(path, QStringLiteral("internalName")), key.key);
+            key.modifiable = optBool(o, QStringLiteral("modifiable"), dot(path, QStringLiteral("modifiable")), true);
+            key.available = optBool(o, QStringLiteral("available"), dot(path, QStringLiteral("available")), true);
+            key.type = optInt(o, QStringLiteral("type"), dot(path, QStringLiteral("type")), 1);
+            key.textSearchable = optBool(o, QStringLiteral("textSearchable"), dot(path, QStringLiteral("textSearchable")), true);
+            key.hasCustomValues = optBool(o, QStringLiteral("customValues"), dot(path, QStringLiteral("customValues")), false);
+            mTree.keys.append(key);
+        }
+    }
+
+    void readResolutions(const QJsonObject& top)
+    {
+        const QJsonArray list = optArray(top, QStringLiteral("resolutions"), QStringLiteral("resolutions"));
+        for (int i = 0; i < list.size(); ++i) {
+            const QString path = at(QStringLiteral("resolutions"), i);
+            const QJsonObject o = element(list, i, path);
+            Resolution r;
+            r.label = reqString(o, QStringLiteral("label"), dot(path, QStringLiteral("label")));
+            r.id = reqString(o, QStringLiteral("id"), dot(path, QStringLiteral("id")));
+            r.type = optInt(o, QStringLiteral("type"), dot(path, QStringLiteral("type")), 2);
+            if (r.type != 2 && r.type != 3)
+                fail(dot(path, QStringLiteral("type")), QStringLiteral("expected 2 (video) or 3 (audio)"));
+            mTree.resolutions.append(r);
+        }
+    }
+
+    void readSettings(const QJsonObject& top)
+    {
+        const QString base = QStringLiteral("settings");
+        const QJsonObject settings = optObject(top, base, base);
+        mTree.workgroupSettings = readPairs(optObject(settings, QStringLiteral("workgroup"), dot(base, QStringLiteral("workgroup"))),
+                                            dot(base, QStringLiteral("workgroup")));
+        const QString appsPath = dot(base, QStringLiteral("applications"));
+        const QJsonObject apps = optObject(settings, QStringLiteral("applications"), appsPath);
+        for (auto it = apps.begin(); it != apps.end(); ++it) {
+            if (!it.value().isObject())
+                fail(dot(appsPath, it.key()), QStringLiteral("expected an object"));
+            mTree.applicationSettings.insert(it.key(), readPairs(it.value().toObject(), dot(appsPath, it.key())));
+        }
+        const QString usersPath = dot(base, QStringLiteral("users"));
+        const QJsonObject users = optObject(settings, QStringLiteral("users"), usersPath);
+        for (auto it = users.begin(); it != users.end(); ++it) {
+            if (!mTree.user(it.key()))
+                fail(dot(usersPath, it.key()), QStringLiteral("no user is named \"%1\"").arg(it.key()));
+            if (!it.value().isObject())
+                fail(dot(usersPath, it.key()), QStringLiteral("expected an object"));
+            mTree.userSettings.insert(it.key(), readPairs(it.value().toObject(), dot(usersPath, it.key())));
+        }
+    }
+
+    QList<Marker> readMarkers(const QJsonObject& o, const QString& key, const QString& path)
+    {
+        QList<Marker> markers;
+        const QJsonArray list = optArray(o, key, dot(path, key));
+        for (int i = 0; i < list.size(); ++i) {
+            const QString p = at(dot(path, key), i);
+            const QJsonObject m = element(list, i, p);
+            Marker marker;
+            marker.id = reqString(m, QStringLiteral("id"), dot(p, QStringLiteral("id")));
+            marker.properties = readPairs(optObject(m, QStringLiteral("properties"), dot(p, QStringLiteral("properties"))),
+                                          dot(p, QStringLiteral("properties")));
+            markers.append(marker);
+        }
+        return markers;
+    }
+
+    Node& readNode(const QJsonObject& o, const QString& path, Node* parent)
+    {
+        Node node;
+        node.id = optString(o, QStringLiteral("id"), dot(path, QStringLiteral("id")), QString());
+        if (node.id.isEmpty())
+            node.id = mTree.newNodeId();
+        if (mTree.byId(node.id))
+            fail(dot(path, QStringLiteral("id")), QStringLiteral("a second node with the ID \"%1\"").arg(node.id));
+        node.moniker = optString(o, QStringLiteral("moniker"), dot(path, QStringLiteral("moniker")), kMonikerPrefix + node.id);
+        if (node.moniker.isEmpty())
+            fail(dot(path, QStringLiteral("moniker")), QStringLiteral("must not be empty"));
+        if (mTree.idByMoniker.contains(node.moniker))
+            fail(dot(path, QStringLiteral("moniker")), QStringLiteral("a second node with the moniker \"%1\"").arg(node.moniker));
+        node.name = reqString(o, QStringLiteral("name"), dot(path, QStringLiteral("name")));
+        node.mimeType = reqString(o, QStringLiteral("mimeType"), dot(path, QStringLiteral("mimeType")));
+        Zel_MimeTypeValue mimeValue;
+        if (!Zel_MimeTypeSpec::getType(node.mimeType, mimeValue))
+            fail(dot(path, QStringLiteral("mimeType")), QStringLiteral("unknown mime type \"%1\"").arg(node.mimeType));
+        if (parent && !Zel_MimeTypeSpec(0x7E00).isType(parent->mimeType))
+            fail(path, QStringLiteral("the parent \"%1\" is a %2, which cannot hold children").arg(parent->name, parent->mimeType));
+        node.mobId = optString(o, QStringLiteral("mobID"), dot(path, QStringLiteral("mobID")), QString());
+        node.masterMoniker = optString(o, QStringLiteral("master"), dot(path, QStringLiteral("master")), QString());
+        node.userPlaced = optBool(o, QStringLiteral("userPlaced"), dot(path, QStringLiteral("userPlaced")), true);
+        node.created = optDate(o, QStringLiteral("created"), dot(path, QStringLiteral("created")));
+        node.modified = optDate(o, QStringLiteral("modified"), dot(path, QStringLiteral("modified")));
+
+        const QString propsPath = dot(path, QStringLiteral("properties"));
+        const QJsonObject props = optObject(o, QStringLiteral("properties"), propsPath);
+        for (auto it = props.begin(); it != props.end(); ++it) {
+            Property p;
+            p.key = it.key();
+            if (p.key == QLatin1String("Name") || p.key == QLatin1String("Mime Type") || p.key == QLatin1String("MobID"))
+                fail(dot(propsPath, p.key), QStringLiteral("set by \"name\", \"mimeType\" and \"mobID\", not as a property"));
+            if (it.value().isString()) {
+                p.value = it.value().toString();
+            } else if (it.value().isObject()) {
+                const QJsonObject po = it.value().toObject();
+                p.value = optString(po, QStringLiteral("value"), dot(dot(propsPath, p.key), QStringLiteral("value")), QString());
+                p.customValues = optString(po, QStringLiteral("customValues"), dot(dot(propsPath, p.key), QStringLiteral("customValues")), QString());
+            } else {
+                fail(dot(propsPath, p.key), QStringLiteral("expected a string or an object with \"value\" and \"customValues\""));
+            }
+            node.properties.append(p);
+        }
+
+        const QString resPath = dot(path, QStringLiteral("reservation"));
+        const QJsonObject reservation = optObject(o, QStringLiteral("reservation"), resPath);
+        if (!reservation.isEmpty()) {
+            node.reservation.user = reqString(reservation, QStringLiteral("user"), dot(resPath, QStringLiteral("user")));
+            if (!mTree.user(node.reservation.user))
+                fail(dot(resPath, QStringLiteral("user")), QStringLiteral("no user is named \"%1\"").arg(node.reservation.user));
+            node.reservation.since = optDate(reservation, QStringLiteral("since"), dot(resPath, QStringLiteral("since")));
+            node.reservation.until = optDate(reservation, QStringLiteral("until"), dot(resPath, QStringLiteral("until")));
+        }
+
+        const QString permPath = dot(path, QStringLiteral("permissions"));
+        const QJsonObject permissions = optObject(o, QStringLiteral("permissions"), permPath);
+        for (auto it = permissions.begin(); it != permissions.end(); ++it) {
+            const QString p = dot(permPath, it.key());
+            if (it.key() != QLatin1String("*") && !mTree.user(it.key()))
+                fail(p, QStringLiteral("no user is named \"%1\"").arg(it.key()));
+            if (!it.value().isArray())
+                fail(p, QStringLiteral("expected an array of permission names"));
+            QStringList names;
+            for (const QJsonValue& v : it.value().toArray()) {
+                if (!v.isString())
+                    fail(p, QStringLiteral("expected an array of permission names"));
+                names << v.toString();
+            }
+            std::uint32_t bits = 0;
+            QString unknown;
+            if (!permissionsFromNames(names, bits, unknown))
+                fail(p, QStringLiteral("unknown permission \"%1\"").arg(unknown));
+            node.permissions.insert(it.key(), bits);
+        }
+
+        node.locators = readMarkers(o, QStringLiteral("locators"), path);
+        node.restrictions = readMarkers(o, QStringLiteral("restrictions"), path);
+
+        const QJsonArray deps = optArray(o, QStringLiteral("dependencies"), dot(path, QStringLiteral("dependencies")));
+        for (int i = 0; i < deps.size(); ++i) {
+            const QString p = at(dot(path, QStringLiteral("dependencies")), i);
+            const QJsonObject d = element(deps, i, p);
+            Dependency dep;
+            dep.moniker = reqString(d, QStringLiteral("moniker"), dot(p, QStringLiteral("moniker")));
+            dep.usage = optString(d, QStringLiteral("usage"), dot(p, QStringLiteral("usage")), QString());
+            dep.type = optInt(d, QStringLiteral("type"), dot(p, QStringLiteral("type")), 0);
+            node.dependencies.append(dep);
+        }
+
+        const QJsonArray media = optArray(o, QStringLiteral("media"), dot(path, QStringLiteral("media")));
+        for (int i = 0; i < media.size(); ++i) {
+            const QString p = at(dot(path, QStringLiteral("media")), i);
+            const QJsonObject m = element(media, i, p);
+            Media file;
+            file.path = reqString(m, QStringLiteral("path"), dot(p, QStringLiteral("path")));
+            file.resolution = optString(m, QStringLiteral("resolution"), dot(p, QStringLiteral("resolution")), QString());
+            node.media.append(file);
+        }
+
+        Node* stored = nullptr;
+        if (parent) {
+            stored = &mTree.insertNode(std::move(node), *parent);
+        } else {
+            const QString id = node.id;
+            mTree.idByMoniker.insert(node.moniker, id);
+            stored = &mTree.nodes.emplace(id, std::move(node)).first->second;
+        }
+        mPaths.insert(stored->id, path);
+
+        const QJsonArray children = optArray(o, QStringLiteral("children"), dot(path, QStringLiteral("children")));
+        for (int i = 0; i < children.size(); ++i) {
+            const QString p = at(dot(path, QStringLiteral("children")), i);
+            const QJsonObject child = element(children, i, p);
+            const QString childName = child.value(QStringLiteral("name")).toString();
+            if (!childName.isEmpty() && mTree.childNamed(*stored, childName))
+                fail(dot(p, QStringLiteral("name")), QStringLiteral("a second child named \"%1\" in \"%2\"").arg(childName, stored->name));
+            readNode(child, p, stored);
+        }
+        return *stored;
+    }
+
+    void resolveReferences()
+    {
+        for (const auto& entry : mTree.nodes) {
+            const Node& node = entry.second;
+            if (!node.masterMoniker.isEmpty() && !mTree.byMoniker(node.masterMoniker) && !mTree.byId(node.masterMoniker))
+                fail(dot(mPaths.value(node.id), QStringLiteral("master")),
+                     QStringLiteral("no node has the moniker or ID \"%1\"").arg(node.masterMoniker));
+        }
+        // A master given by ID is stored as the master's moniker.
+        for (auto& entry : mTree.nodes) {
+            Node& node = entry.second;
+            if (!node.masterMoniker.isEmpty() && !mTree.byMoniker(node.masterMoniker))
+                node.masterMoniker = mTree.byId(node.masterMoniker)->moniker;
+        }
+    }
+
+    void readLinkedProjects(const QJsonObject& top)
+    {
+        const QJsonArray list = optArray(top, QStringLiteral("linkedProjects"), QStringLiteral("linkedProjects"));
+        for (int i = 0; i < list.size(); ++i) {
+            const QString path = at(QStringLiteral("linkedProjects"), i);
+            if (!list.at(i).isString())
+                fail(path, QStringLiteral("expected a string"));
+            const QString ref = list.at(i).toString();
+            const Node* node = mTree.byMoniker(ref);
+            if (!node)
+                node = mTree.byId(ref);
+            if (!node)
+                fail(path, QStringLiteral("no node has the moniker or ID \"%1\"").arg(ref));
+            mTree.linkedProjects.append(node->moniker);
+        }
+    }
+
+    Tree& mTree;
+    QString mSource;
+    QHash<QString, QString> mPaths; // node ID -> path in the file
+};
+
+// Line and column (both from 1; the column counts characters) of a byte offset.
+void position(const QByteArray& data, int offset, int& line, int& column)
+{
+    offset = qBound(0, offset, data.size());
+    line = 1;
+    int lineStart = 0;
+    for (int i = 0; i < offset; ++i) {
+        if (data.at(i) == '\n') {
+            ++line;
+            lineStart = i + 1;
+        }
+    }
+    column = QString::fromUtf8(data.constData() + lineStart, offset - lineStart).size() + 1;
+}
+
+QJsonObject pairsToObject(const SettingPairs& pairs)
+{
+    QJsonObject o;
+    for (const auto& pair : pairs)
+        o.insert(pair.first, pair.second);
+    return o;
+}
+
+QString isoDate(const QDateTime& date)
+{
+    return date.toUTC().toString(Qt::ISODate);
+}
+
+QJsonArray markersToJson(const QList<Marker>& markers)
+{
+    QJsonArray list;
+    for (const Marker& m : markers) {
+        QJsonObject o;
+        o.insert(QStringLiteral("id"), m.id);
+        if (!m.properties.isEmpty())
+            o.insert(QStringLiteral("properties"), pairsToObject(m.properties));
+        list.append(o);
+    }
+    return list;
+}
+
+QJsonObject nodeToJson(const Tree& tree, const Node& node)
+{
+    QJsonObject o;
+    o.insert(QStringLiteral("id"), node.id);
+    if (node.moniker != kMonikerPrefix + node.id)
+        o.insert(QStringLiteral("moniker"), node.moniker);
+    o.insert(QStringLiteral("name"), node.name);
+    o.insert(QStringLiteral("mimeType"), node.mimeType);
+    if (!node.mobId.isEmpty())
+        o.insert(QStringLiteral("mobID"), node.mobId);
+    if (!node.masterMoniker.isEmpty())
+        o.insert(QStringLiteral("master"), node.masterMoniker);
+    if (!node.userPlaced)
+        o.insert(QStringLiteral("userPlaced"), false);
+    if (node.created.isValid())
+        o.insert(QStringLiteral("created"), isoDate(node.created));
+    if (node.modified.isValid())
+        o.insert(QStringLiteral("modified"), isoDate(node.modified));
+    if (!node.properties.isEmpty()) {
+        QJsonObject props;
+        for (const Property& p : node.properties) {
+            if (p.customValues.isEmpty()) {
+                props.insert(p.key, p.value);
+            } else {
+                QJsonObject po;
+                po.insert(QStringLiteral("value"), p.value);
+                po.insert(QStringLiteral("customValues"), p.customValues);
+                props.insert(p.key, po);
+            }
+        }
+        o.insert(QStringLiteral("properties"), props);
+    }
+    if (!node.reservation.user.isEmpty()) {
+        QJsonObject r;
+        r.insert(QStringLiteral("user"), node.reservation.user);
+        if (node.reservation.since.isValid())
+            r.insert(QStringLiteral("since"), isoDate(node.reservation.since));
+        if (node.reservation.until.isValid())
+            r.insert(QStringLiteral("until"), isoDate(node.reservation.until));
+        o.insert(QStringLiteral("reservation"), r);
+    }
+    if (!node.permissions.isEmpty()) {
+        QJsonObject perms;
+        for (auto it = node.permissions.constBegin(); it != node.permissions.constEnd(); ++it)
+            perms.insert(it.key(), QJsonArray::fromStringList(permissionNames(it.value())));
+        o.insert(QStringLiteral("permissions"), perms);
+    }
+    if (!node.locators.isEmpty())
+        o.insert(QStringLiteral("locators"), markersToJson(node.locators));
+    if (!node.restrictions.isEmpty())
+        o.insert(QStringLiteral("restrictions"), markersToJson(node.restrictions));
+    if (!node.dependencies.isEmpty()) {
+        QJsonArray deps;
+        for (const Dependency& d : node.dependencies) {
+            QJsonObject dep;
+            dep.insert(QStringLiteral("moniker"), d.moniker);
+            dep.insert(QStringLiteral("usage"), d.usage);
+            dep.insert(QStringLiteral("type"), d.type);
+            deps.append(dep);
+        }
+        o.insert(QStringLiteral("dependencies"), deps);
+    }
+    if (!node.media.isEmpty()) {
+        QJsonArray media;
+        for (const Media& m : node.media) {
+            QJsonObject file;
+            file.insert(QStringLiteral("path"), m.path);
+            if (!m.resolution.isEmpty())
+                file.insert(QStringLiteral("resolution"), m.resolution);
+            media.append(file);
+        }
+        o.insert(QStringLiteral("media"), media);
+    }
+    if (!node.children.isEmpty()) {
+        QJsonArray children;
+        for (const QString& id : node.children) {
+            if (const Node* child = tree.byId(id))
+                children.append(nodeToJson(tree, *child));
+        }
+        o.insert(QStringLiteral("children"), children);
+    }
+    return o;
+}
+
+} // namespace
+
+bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QString& error)
+{
+    QJsonParseError parseError;
+    const QJsonDocument document = QJsonDocument::fromJson(json, &parseError);
+    if (parseError.error != QJsonParseError::NoError) {
+        int line = 0;
+        int column = 0;
+        position(json, parseError.offset, line, column);
+        error = QStringLiteral("%1:%2:%3: %4").arg(sourceName).arg(line).arg(column).arg(parseError.errorString());
+        return false;
+    }
+    if (!document.isObject()) {
+        error = sourceName + QStringLiteral(": the tree file must hold one JSON object");
+        return false;
+    }
+    try {
+        Reader(tree, sourceName).read(document.object());
+    } catch (const Failure& failure) {
+        error = failure.message;
+        return false;
+    }
+    return true;
+}
+
+QByteArray saveTree(const Tree& tree)
+{
+    QJsonObject top;
+    top.insert(QStringLiteral("format"), QLatin1String(kFormat));
+    top.insert(QStringLiteral("version"), 1);
+    top.insert(QStringLiteral("server"), tree.serverName);
+
+    QJsonArray users;
+    for (const User& u : tree.users) {
+        QJsonObject o;
+        o.insert(QStringLiteral("name"), u.name);
+        o.insert(QStringLiteral("password"), u.password);
+        o.insert(QStringLiteral("fullName"), u.fullName);
+        if (u.admin)
+            o.insert(QStringLiteral("admin"), true);
+        users.append(o);
+    }
+    top.insert(QStringLiteral("users"), users);
+
+    QJsonArray keys;
+    for (const KeyDesc& k : tree.keys) {
+        QJsonObject o;
+        o.insert(QStringLiteral("key"), k.key);
+        o.insert(QStringLiteral("displayName"), k.displayName);
+        o.insert(QStringLiteral("internalName"), k.internalName);
+        o.insert(QStringLiteral("modifiable"), k.modifiable);
+        o.insert(QStringLiteral("available"), k.available);
+        o.insert(QStringLiteral("type"), k.type);
+        o.insert(QStringLiteral("textSearchable"), k.textSearchable);
+        o.insert(QStringLiteral("customValues"), k.hasCustomValues);
+        keys.append(o);
+    }
+    top.insert(QStringLiteral("propertyKeys"), keys);
+
+    QJsonArray resolutions;
+    for (const auto& r : tree.resolutions) {
+        QJsonObject o;
+        o.insert(QStringLiteral("label"), r.label);
+        o.insert(QStringLiteral("id"), r.id);
+        o.insert(QStringLiteral("type"), r.type);
+        resolutions.append(o);
+    }
+    top.insert(QStringLiteral("resolutions"), resolutions);
+
+    QJsonObject settings;
+    settings.insert(QStringLiteral("workgroup"), pairsToObject(tree.workgroupSettings));
+    QJsonObject apps;
+    for (auto it = tree.applicationSettings.constBegin(); it != tree.applicationSettings.constEnd(); ++it)
+        apps.insert(it.key(), pairsToObject(it.value()));
+    settings.insert(QStringLiteral("applications"), apps);
+    QJsonObject userSettings;
+    for (auto it = tree.userSettings.constBegin(); it != tree.userSettings.constEnd(); ++it)
+        userSettings.insert(it.key(), pairsToObject(it.value()));
+    settings.insert(QStringLiteral("users"), userSettings);
+    top.insert(QStringLiteral("settings"), settings);
+
+    if (!tree.linkedProjects.isEmpty())
+        top.insert(QStringLiteral("linkedProjects"), QJsonArray::fromStringList(tree.linkedProjects));
+
+    if (const Node* root = tree.byId(tree.rootId))
+        top.insert(QStringLiteral("root"), nodeToJson(tree, *root));
+    return QJsonDocument(top).toJson(QJsonDocument::Indented);
+}
+
+} // namespace ZelMemory

@@ -1,0 +1,381 @@
+#include "memory_tree_p.h"
+
+#include <QUuid>
+
+namespace ZelMemory {
+
+namespace {
+
+const char* const kPermissionNames[PermissionCount] = {
+    "Owner", "Admin", "SendToPlayback", "ReadAllLogs", "UseHighResolution", "UseLowResolution",
+    "ArchiveRestore", "UserAttributeManagement", "CanCreateColumns", "CanModifyColumns",
+    "CanModifyPropertiesInAccess", "Read", "Copy", "AddFiles", "AddFolders", "WriteAttributes",
+    "WriteUserAttributes", "WriteNewVersions", "CanWriteLocators", "CanWriteDRMs", "DeleteAssets",
+    "DestroyAssets", "DestroyMedia", "Reserve", "OverrideReservation", "PermissionsManagement",
+    "CanCreateLocators", "CanModifyLocators", "CanCreateRestrictions", "CanModifyRestrictions"};
+
+} // namespace
+
+const char* permissionName(int index)
+{
+    return index >= 0 && index < PermissionCount ? kPermissionNames[index] : "";
+}
+
+bool permissionsFromNames(const QStringList& names, std::uint32_t& bits, QString& unknown)
+{
+    std::uint32_t result = 0;
+    for (const QString& name : names) {
+        if (name == QLatin1String("All")) {
+            result |= AllPermissions;
+            continue;
+        }
+        int i = 0;
+        while (i < PermissionCount && name != QLatin1String(kPermissionNames[i]))
+            ++i;
+        if (i == PermissionCount) {
+            unknown = name;
+            return false;
+        }
+        result |= 1u << i;
+    }
+    bits = result;
+    return true;
+}
+
+QStringList permissionNames(std::uint32_t bits)
+{
+    if ((bits & AllPermissions) == AllPermissions)
+        return QStringList(QStringLiteral("All"));
+    QStringList names;
+    for (int i = 0; i < PermissionCount; ++i) {
+        if (bits & (1u << i))
+            names << QLatin1String(kPermissionNames[i]);
+    }
+    return names;
+}
+
+Zel_PropertyKeyInfo keyInfo(const KeyDesc& k)
+{
+    return Zel_PropertyKeyInfo(k.key, k.displayName, k.modifiable, k.available, k.internalName,
+                               static_cast<Zel_PropertyKeyType>(k.type), k.textSearchable, k.hasCustomValues);
+}
+
+Observer::~Observer() = default;
+
+Tree::Tree() = default;
+
+Node* Tree::byId(const QString& id)
+{
+    auto it = nodes.find(id);
+    return it == nodes.end() ? nullptr : &it->second;
+}
+
+const Node* Tree::byId(const QString& id) const
+{
+    auto it = nodes.find(id);
+    return it == nodes.end() ? nullptr : &it->second;
+}
+
+Node* Tree::byMoniker(const QString& moniker)
+{
+    auto it = idByMoniker.constFind(moniker);
+    return it == idByMoniker.constEnd() ? nullptr : byId(it.value());
+}
+
+const Node* Tree::byMoniker(const QString& moniker) const
+{
+    auto it = idByMoniker.constFind(moniker);
+    return it == idByMoniker.constEnd() ? nullptr : byId(it.value());
+}
+
+const Node* Tree::parentOf(const Node& node) const
+{
+    return node.parentId.isEmpty() ? nullptr : byId(node.parentId);
+}
+
+const User* Tree::user(const QString& name) const
+{
+    for (const User& u : users) {
+        if (u.name == name)
+            return &u;
+    }
+    return nullptr;
+}
+
+const KeyDesc* Tree::key(const QString& name) const
+{
+    for (const KeyDesc& k : keys) {
+        if (k.key == name)
+            return &k;
+    }
+    return nullptr;
+}
+
+const Node* Tree::byPath(const QString& path) const
+{
+    const Node* node = byId(rootId);
+    const QStringList parts = path.split(QLatin1Char('/'), Qt::SkipEmptyParts);
+    for (const QString& part : parts) {
+        if (!node)
+            return nullptr;
+        node = childNamed(*node, part);
+    }
+    return node;
+}
+
+QStringList Tree::pathOf(const Node& node) const
+{
+    QStringList names;
+    for (const Node* n = &node; n && n->id != rootId; n = parentOf(*n))
+        names.prepend(n->name);
+    return names;
+}
+
+bool Tree::isSelfOrAncestor(const Node& ancestor, const Node& node) const
+{
+    for (const Node* n = &node; n; n = parentOf(*n)) {
+        if (n->id == ancestor.id)
+            return true;
+    }
+    return false;
+}
+
+std::uint32_t Tree::permissionsOf(const QString& userName, const Node& node) const
+{
+    const User* u = user(userName);
+    if (!u)
+        return 0;
+    if (u->admin)
+        return AllPermissions;
+    const QString everyone = QStringLiteral("*");
+    for (const Node* n = &node; n; n = parentOf(*n)) {
+        auto own = n->permissions.constFind(userName);
+        if (own != n->permissions.constEnd())
+            return own.value();
+        auto all = n->permissions.constFind(everyone);
+        if (all != n->permissions.constEnd())
+            return all.value();
+    }
+    return 0;
+}
+
+const Node* Tree::reservedByOther(const Node& node, const QString& userName) const
+{
+    if (!node.reservation.user.isEmpty() && node.reservation.user != userName)
+        return &node;
+    for (const QString& id : node.children) {
+        if (const Node* child = byId(id)) {
+            if (const Node* found = reservedByOther(*child, userName))
+                return found;
+        }
+    }
+    return nullptr;
+}
+
+const Node* Tree::childNamed(const Node& parent, const QString& name) const
+{
+    for (const QString& id : parent.children) {
+        const Node* child = byId(id);
+        if (child && child->name == name)
+            return child;
+    }
+    return nullptr;
+}
+
+QString Tree::uniqueChildName(const Node& parent, const QString& name) const
+{
+    if (!childNamed(parent, name))
+        return name;
+    for (int n = 2;; ++n) {
+        const QString candidate = name + QLatin1Char(' ') + QString::number(n);
+        if (!childNamed(parent, candidate))
+            return candidate;
+    }
+}
+
+QString Tree::propertyValue(const Node& node, const QString& keyName) const
+{
+    if (keyName == QLatin1String("Name"))
+        return node.name;
+    if (keyName == QLatin1String("Mime Type"))
+        return node.mimeType;
+    if (keyName == QLatin1String("MobID"))
+        return node.mobId;
+    for (const Property& p : node.properties) {
+        if (p.key == keyName)
+            return p.value;
+    }
+    return QString();
+}
+
+QString Tree::newNodeId()
+{
+    for (;;) {
+        const QString id = QStringLiteral("N%1").arg(++serial, 6, 10, QLatin1Char('0'));
+        if (!byId(id) && !idByMoniker.contains(QStringLiteral("zel-mem://") + id))
+            return id;
+    }
+}
+
+QString Tree::newMobId()
+{
+    // Shaped like the AAF MobIDs of the sample tree: a fixed label, then a
+    // unique part.
+    return QStringLiteral("060a2b340101010101010f00.13000000.")
+        + QUuid::createUuid().toString().remove(QLatin1Char('{')).remove(QLatin1Char('}')).remove(
+            QLatin1Char('-'));
+}
+
+Node& Tree::insertNode(Node node, Node& parent)
+{
+    node.parentId = parent.id;
+    const QString id = node.id;
+    idByMoniker.insert(node.moniker, id);
+    parent.children.append(id);
+    Node& stored = nodes.emplace(id, std::move(node)).first->second;
+    return stored;
+}
+
+Node& Tree::copySubtree(const Node& source, Node& target, const QString& name)
+{
+    Node copy = source;
+    copy.id = newNodeId();
+    copy.moniker = QStringLiteral("zel-mem://") + copy.id;
+    copy.name = name;
+    copy.children.clear();
+    copy.reservation = Reservation();
+    copy.created = copy.modified = QDateTime::currentDateTimeUtc();
+    if (!copy.mobId.isEmpty())
+        copy.mobId = newMobId();
+    const QStringList sourceChildren = source.children; // source may move on insertion? no: stable refs
+    Node& stored = insertNode(std::move(copy), target);
+    for (const QString& childId : sourceChildren) {
+        if (const Node* child = byId(childId)) {
+            const Node childCopy = *child; // copy first: stored may be its ancestor
+            copySubtree(childCopy, stored, childCopy.name);
+        }
+    }
+    return stored;
+}
+
+void Tree::removeSubtree(const QString& id, QStringList* removed)
+{
+    Node* node = byId(id);
+    if (!node)
+        return;
+    const QStringList children = node->children;
+    for (const QString& childId : children)
+        removeSubtree(childId, removed);
+    node = byId(id);
+    if (!node)
+        return;
+    detach(*node);
+    idByMoniker.remove(node->moniker);
+    if (removed)
+        removed->append(id);
+    nodes.erase(id);
+}
+
+void Tree::detach(Node& node)
+{
+    if (Node* parent = byId(node.parentId))
+        parent->children.removeAll(node.id);
+    node.parentId.clear();
+}
+
+void Tree::addObserver(const boost::shared_ptr<Observer>& observer)
+{
+    std::lock_guard<std::mutex> lock(mObserverMutex);
+    mObservers.push_back(observer);
+}
+
+void Tree::removeObserver(const Observer* observer)
+{
+    std::lock_guard<std::mutex> lock(mObserverMutex);
+    for (auto it = mObservers.begin(); it != mObservers.end();) {
+        boost::shared_ptr<Observer> held = it->lock();
+        if (!held || held.get() == observer)
+            it = mObservers.erase(it);
+        else
+            ++it;
+    }
+}
+
+std::uint64_t Tree::takeTicket()
+{
+    std::lock_guard<std::mutex> lock(mTicketMutex);
+    return mNextTicket++;
+}
+
+void Tree::publish(std::uint64_t ticket, const std::vector<Change>& changes)
+{
+    std::unique_lock<std::mutex> turn(mTicketMutex);
+    mTicketTurn.wait(turn, [&] { return mServing == ticket; });
+    turn.unlock();
+
+    std::vector<boost::shared_ptr<Observer>> observers;
+    {
+        std::lock_guard<std::mutex> lock(mObserverMutex);
+        for (const boost::weak_ptr<Observer>& weak : mObservers) {
+            if (boost::shared_ptr<Observer> held = weak.lock())
+                observers.push_back(held);
+        }
+    }
+    struct PassTurn {
+        Tree* tree;
+        ~PassTurn()
+        {
+            {
+                std::lock_guard<std::mutex> lock(tree->mTicketMutex);
+                ++tree->mServing;
+            }
+            tree->mTicketTurn.notify_all();
+        }
+    } passTurn{this};
+    if (!changes.empty()) {
+        for (const boost::shared_ptr<Observer>& observer : observers)
+            observer->treeChanged(changes);
+    }
+}
+
+WriteHold::WriteHold(Tree& tree)
+    : mTree(tree)
+    , mLock(tree.mutex)
+{
+}
+
+WriteHold::~WriteHold()
+{
+    release();
+}
+
+void WriteHold::added(const QString& parentMoniker, const QString& childMoniker)
+{
+    mChanges.push_back(Change{Change::Added, parentMoniker, childMoniker});
+}
+
+void WriteHold::removed(const QString& parentMoniker, const QString& childMoniker)
+{
+    mChanges.push_back(Change{Change::Removed, parentMoniker, childMoniker});
+}
+
+void WriteHold::updated(const QString& parentMoniker, const QString& childMoniker)
+{
+    mChanges.push_back(Change{Change::Updated, parentMoniker, childMoniker});
+}
+
+void WriteHold::release()
+{
+    if (mReleased)
+        return;
+    mReleased = true;
+    if (mChanges.empty()) {
+        mLock.unlock();
+        return;
+    }
+    const std::uint64_t ticket = mTree.takeTicket();
+    mLock.unlock();
+    mTree.publish(ticket, mChanges);
+}
+
+} // namespace ZelMemory
