@@ -1,0 +1,376 @@
+#include "Zel_SettingList.h"
+
+#include "TraceCapture.h"
+
+#include <QDateTime>
+#include <QDomDocument>
+#include <QDomElement>
+#include <QDomImplementation>
+#include <QDomNode>
+#include <QElapsedTimer>
+#include <QRegularExpression>
+#include <QStringList>
+
+#include <gtest/gtest.h>
+
+#include <string>
+
+namespace {
+
+Zel_SettingList settings(std::initializer_list<std::pair<const char*, const char*>> pairs)
+{
+    Zel_SettingList list;
+    for (const auto& pair : pairs)
+        list.append(Zel_Setting(QString::fromUtf8(pair.first), QString::fromUtf8(pair.second)));
+    return list;
+}
+
+// Parses the text; fails the test when it is not well-formed XML.
+QDomElement parse(const QString& xml)
+{
+    QDomDocument document;
+    QString error;
+    int line = 0;
+    int column = 0;
+    EXPECT_TRUE(document.setContent(xml, &error, &line, &column))
+        << error.toStdString() << " at " << line << ":" << column << " in\n" << xml.toStdString();
+    return document.documentElement();
+}
+
+// The child elements' names, in order.
+QStringList childNames(const QDomElement& element)
+{
+    QStringList names;
+    for (QDomElement child = element.firstChildElement(); !child.isNull(); child = child.nextSiblingElement())
+        names << child.tagName();
+    return names;
+}
+
+// The concatenated text nodes directly inside an element (not its children's).
+QString ownText(const QDomElement& element)
+{
+    QString text;
+    for (QDomNode node = element.firstChild(); !node.isNull(); node = node.nextSibling()) {
+        if (node.isText())
+            text += node.toText().data();
+    }
+    return text;
+}
+
+std::string str(const QString& text)
+{
+    return text.toStdString();
+}
+
+} // namespace
+
+TEST(Zel_SettingListTest, SettingComparesAndRendersKeyColonValue)
+{
+    EXPECT_EQ(QStringLiteral("a.b:v"), static_cast<QString>(Zel_Setting("a.b", "v")));
+    EXPECT_EQ(QStringLiteral(":"), static_cast<QString>(Zel_Setting()));
+    EXPECT_TRUE(Zel_Setting("k", "v") == Zel_Setting("k", "v"));
+    EXPECT_TRUE(Zel_Setting("k", "v") != Zel_Setting("K", "v"));
+    EXPECT_TRUE(Zel_Setting("k", "v") != Zel_Setting("k", "V"));
+    EXPECT_FALSE(Zel_Setting("k", "v") != Zel_Setting("k", "v"));
+}
+
+TEST(Zel_SettingListTest, FindByKeyGivesTheFirstAndAddIfKeyNotInListKeepsTheOld)
+{
+    Zel_SettingList list = settings({{"k", "1"}, {"other", "x"}, {"k", "2"}});
+    EXPECT_EQ(Zel_Setting("k", "1"), list.findByKey("k"));
+    EXPECT_EQ(Zel_Setting(), list.findByKey("K"));
+    EXPECT_TRUE(list.findByKey("missing").key().isEmpty());
+    EXPECT_TRUE(list.findByKey("missing").value().isEmpty());
+
+    list.addIfKeyNotInList(Zel_Setting("other", "changed"));
+    EXPECT_EQ(3, list.size());
+    EXPECT_EQ(QStringLiteral("x"), list.findByKey("other").value());
+    list.addIfKeyNotInList(Zel_Setting("new", "n"));
+    ASSERT_EQ(4, list.size());
+    EXPECT_EQ(Zel_Setting("new", "n"), list.last());
+
+    EXPECT_EQ(QStringLiteral("k:1\nother:x\nk:2\nnew:n"), static_cast<QString>(list));
+    EXPECT_EQ(QString(), static_cast<QString>(Zel_SettingList()));
+    const Zel_SettingList copy(list);
+    EXPECT_EQ(list, copy);
+}
+
+TEST(Zel_SettingListTest, XmlNestsDottedKeysWithOneBlankOfIndentPerLevel)
+{
+    const Zel_SettingList list =
+        settings({{"General.Language", "en"}, {"General.Units", "metric"}, {"Recent", ""}});
+    const QString xml = list.toXML("Settings");
+
+    const QDomElement root = parse(xml);
+    EXPECT_EQ(QStringLiteral("Settings"), root.tagName());
+    EXPECT_EQ(3, root.attributes().count());
+    EXPECT_EQ(QStringLiteral("1.0"), root.attribute("version"));
+    EXPECT_EQ((QStringList{"General", "Recent"}), childNames(root));
+    const QDomElement general = root.firstChildElement("General");
+    EXPECT_EQ((QStringList{"Language", "Units"}), childNames(general));
+    EXPECT_EQ(QStringLiteral("en"), general.firstChildElement("Language").text());
+    EXPECT_EQ(QStringLiteral("metric"), general.firstChildElement("Units").text());
+    EXPECT_EQ(QString(), root.firstChildElement("Recent").text());
+
+    // Layout: no declaration, root start tag first, one blank per level,
+    // leaves on one line, a line break after the root's end tag. The root's
+    // attribute order is the serialiser's and is not compared.
+    QStringList lines = xml.split('\n');
+    ASSERT_EQ(8, lines.size()) << str(xml);
+    EXPECT_TRUE(lines[0].startsWith("<Settings ")) << str(lines[0]);
+    EXPECT_EQ(QStringLiteral(" <General>"), lines[1]);
+    EXPECT_EQ(QStringLiteral("  <Language>en</Language>"), lines[2]);
+    EXPECT_EQ(QStringLiteral("  <Units>metric</Units>"), lines[3]);
+    EXPECT_EQ(QStringLiteral(" </General>"), lines[4]);
+    EXPECT_TRUE(lines[5].startsWith(" <Recent")) << str(lines[5]);
+    EXPECT_EQ(QStringLiteral("</Settings>"), lines[6]);
+    EXPECT_EQ(QString(), lines[7]);
+}
+
+TEST(Zel_SettingListTest, XmlSharesIntermediatesAndKeepsDuplicateLeavesInOrder)
+{
+    const QDomElement root = parse(settings({{"a.b", "1"},
+                                             {"a.d", "2"},
+                                             {"a.b", "3"},
+                                             {"x.y.z", "v"},
+                                             {"a.b", "4"},
+                                             {"x.y.w", "w"},
+                                             {"leaf", "first"},
+                                             {"leaf", "second"}})
+                                       .toXML("R"));
+    EXPECT_EQ((QStringList{"a", "x", "leaf", "leaf"}), childNames(root));
+
+    const QDomElement a = root.firstChildElement("a");
+    EXPECT_EQ((QStringList{"b", "d", "b", "b"}), childNames(a));
+    QStringList bValues;
+    for (QDomElement b = a.firstChildElement("b"); !b.isNull(); b = b.nextSiblingElement("b"))
+        bValues << b.text();
+    EXPECT_EQ((QStringList{"1", "3", "4"}), bValues);
+    EXPECT_EQ(QStringLiteral("2"), a.firstChildElement("d").text());
+
+    const QDomElement y = root.firstChildElement("x").firstChildElement("y");
+    EXPECT_EQ((QStringList{"z", "w"}), childNames(y));
+    EXPECT_EQ(QStringLiteral("v"), y.firstChildElement("z").text());
+    EXPECT_EQ(QStringLiteral("w"), y.firstChildElement("w").text());
+
+    const QDomElement firstLeaf = root.firstChildElement("leaf");
+    EXPECT_EQ(QStringLiteral("first"), firstLeaf.text());
+    EXPECT_EQ(QStringLiteral("second"), firstLeaf.nextSiblingElement("leaf").text());
+}
+
+TEST(Zel_SettingListTest, XmlLetsALeafGainChildrenThroughTheFirstElementOfThatName)
+{
+    // "a" is made as a leaf with text; "a.b" then descends into that same
+    // element (the first child named a), not into the second leaf a.
+    const QDomElement root =
+        parse(settings({{"a", "x"}, {"a", "second"}, {"a.b", "y"}, {"a.b.c", "z"}}).toXML("R"));
+    EXPECT_EQ((QStringList{"a", "a"}), childNames(root));
+    const QDomElement first = root.firstChildElement("a");
+    EXPECT_EQ(QStringLiteral("x"), ownText(first));
+    EXPECT_EQ((QStringList{"b"}), childNames(first));
+    EXPECT_EQ(QStringLiteral("y"), ownText(first.firstChildElement("b")));
+    EXPECT_EQ(QStringLiteral("z"), first.firstChildElement("b").firstChildElement("c").text());
+    const QDomElement second = first.nextSiblingElement("a");
+    EXPECT_EQ(QStringLiteral("second"), second.text());
+    EXPECT_TRUE(childNames(second).isEmpty());
+}
+
+TEST(Zel_SettingListTest, XmlDropsEmptyKeysAndTheValuesOfKeysEndingInADot)
+{
+    TraceCapture trace;
+    const QDomElement root =
+        parse(settings({{"", "lost"}, {"p.", "lost too"}, {"q.r.", "also lost"}, {"s", ""}}).toXML("R"));
+    EXPECT_EQ((QStringList{"p", "q", "s"}), childNames(root));
+    EXPECT_FALSE(root.firstChildElement("p").hasChildNodes());
+    const QDomElement q = root.firstChildElement("q");
+    EXPECT_EQ((QStringList{"r"}), childNames(q));
+    EXPECT_FALSE(q.firstChildElement("r").hasChildNodes());
+    EXPECT_EQ(QString(), root.firstChildElement("s").text());
+    EXPECT_FALSE(root.text().contains("lost"));
+    // These are ordinary outcomes, not faults: no trace line.
+    EXPECT_TRUE(trace.orvLines().empty());
+}
+
+TEST(Zel_SettingListTest, EmptyListGivesTheRootWithItsThreeAttributesOnly)
+{
+    const QString xml = Zel_SettingList().toXML("Settings");
+    const QDomElement root = parse(xml);
+    EXPECT_EQ(QStringLiteral("Settings"), root.tagName());
+    EXPECT_FALSE(root.hasChildNodes());
+    EXPECT_EQ(3, root.attributes().count());
+    EXPECT_TRUE(root.hasAttribute("version"));
+    EXPECT_TRUE(root.hasAttribute("modifydate"));
+    EXPECT_TRUE(root.hasAttribute("modifydateInt"));
+    EXPECT_TRUE(xml.endsWith("/>\n")) << str(xml);
+    EXPECT_EQ(1, xml.count('\n'));
+
+    // Dots in the root name are not split.
+    EXPECT_EQ(QStringLiteral("my.Settings"), parse(Zel_SettingList().toXML("my.Settings")).tagName());
+}
+
+TEST(Zel_SettingListTest, ModifyDateIntIsTheCurrentTimeInWholeSeconds)
+{
+    const qint64 before = QDateTime::currentDateTimeUtc().toSecsSinceEpoch();
+    const QDomElement root = parse(settings({{"k", "v"}}).toXML("R"));
+    const qint64 after = QDateTime::currentDateTimeUtc().toSecsSinceEpoch();
+
+    const QString stamp = root.attribute("modifydateInt");
+    EXPECT_TRUE(QRegularExpression("^[0-9]+$").match(stamp).hasMatch()) << str(stamp);
+    bool ok = false;
+    const qint64 seconds = stamp.toLongLong(&ok);
+    ASSERT_TRUE(ok);
+    EXPECT_LE(before, seconds);
+    EXPECT_GE(after, seconds);
+
+    // "modifydate" names the same moment in local time, TextDate form.
+    const QDateTime local = QDateTime::fromSecsSinceEpoch(seconds).toLocalTime();
+    const QString date = root.attribute("modifydate");
+    const QDateTime parsed = QDateTime::fromString(date, Qt::TextDate);
+    if (parsed.isValid()) {
+        EXPECT_EQ(local, parsed) << str(date);
+    } else {
+        // Locale day and month names the parser may not read back: check the
+        // parts that do not depend on the locale.
+        EXPECT_TRUE(date.contains(local.time().toString("hh:mm:ss"))) << str(date);
+        EXPECT_TRUE(date.endsWith(QString::number(local.date().year()))) << str(date);
+    }
+}
+
+TEST(Zel_SettingListTest, ModifyDateOfAFixedMomentIsWrittenInBothForms)
+{
+    const QDateTime moment(QDate(2001, 9, 9), QTime(1, 46, 40), Qt::UTC);
+    const QDomElement root = parse(settings({{"k", "v"}}).toXML("R", moment));
+    EXPECT_EQ(QStringLiteral("1000000000"), root.attribute("modifydateInt"));
+    EXPECT_EQ(QStringLiteral("1.0"), root.attribute("version"));
+
+    const QString date = root.attribute("modifydate");
+    EXPECT_EQ(moment.toLocalTime().toString(Qt::TextDate), date);
+    // Day name, month name, day of month, hh:mm:ss, four-digit year.
+    EXPECT_TRUE(QRegularExpression("^\\S+ \\S+ \\d{1,2} \\d{2}:\\d{2}:\\d{2} \\d{4}$").match(date).hasMatch())
+        << str(date);
+    EXPECT_TRUE(date.contains(moment.toLocalTime().time().toString("hh:mm:ss"))) << str(date);
+
+    // Outside the unsigned 32-bit range the stamp saturates instead of wrapping.
+    const QDateTime early(QDate(1969, 12, 31), QTime(23, 59, 59), Qt::UTC);
+    EXPECT_EQ(QStringLiteral("4294967295"), parse(Zel_SettingList().toXML("R", early)).attribute("modifydateInt"));
+    const QDateTime last(QDate(2106, 2, 7), QTime(6, 28, 14), Qt::UTC);
+    EXPECT_EQ(QStringLiteral("4294967294"), parse(Zel_SettingList().toXML("R", last)).attribute("modifydateInt"));
+
+    // An invalid moment is replaced by the current time.
+    const qint64 before = QDateTime::currentDateTimeUtc().toSecsSinceEpoch();
+    const qint64 stamped =
+        parse(Zel_SettingList().toXML("R", QDateTime())).attribute("modifydateInt").toLongLong();
+    EXPECT_LE(before, stamped);
+    EXPECT_GE(QDateTime::currentDateTimeUtc().toSecsSinceEpoch(), stamped);
+}
+
+TEST(Zel_SettingListTest, KeysGivingInvalidNamesAreLeftOutWithOneTraceLineEach)
+{
+    TraceCapture trace;
+    const QDomImplementation::InvalidDataPolicy policy = QDomImplementation::invalidDataPolicy();
+
+    const QString xml = settings({{"good", "1"},
+                                  {"a b", "space"},
+                                  {"1x", "digit first"},
+                                  {"x<y", "angle"},
+                                  {"ok.a b", "bad leaf"},
+                                  {"bad one.ok", "bad intermediate"},
+                                  {"a..b", "empty level"},
+                                  {".", "dot"},
+                                  {".x", "leading dot"},
+                                  {"ns:name", "colon"},
+                                  {"-x", "dash first"},
+                                  {"x&y", "ampersand"},
+                                  {"tail", "2"}})
+                            .toXML("R");
+    EXPECT_EQ(policy, QDomImplementation::invalidDataPolicy());
+
+    const QDomElement root = parse(xml);
+    // Nothing at all is made for a rejected key, not even its valid levels.
+    EXPECT_EQ((QStringList{"good", "tail"}), childNames(root)) << str(xml);
+    EXPECT_EQ(QStringLiteral("1"), root.firstChildElement("good").text());
+    EXPECT_EQ(QStringLiteral("2"), root.firstChildElement("tail").text());
+
+    const std::vector<std::string> lines = trace.orvLines();
+    ASSERT_EQ(11u, lines.size());
+    EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"a b\" does not give valid XML element names; setting left out",
+              lines[0]);
+    EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"1x\" does not give valid XML element names; setting left out",
+              lines[1]);
+    EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"x<y\" does not give valid XML element names; setting left out",
+              lines[2]);
+    EXPECT_NE(std::string::npos, lines[9].find("\"-x\""));
+}
+
+TEST(Zel_SettingListTest, InvalidRootNameGivesAnEmptyTextAndATraceLine)
+{
+    TraceCapture trace;
+    const Zel_SettingList list = settings({{"k", "v"}});
+    EXPECT_EQ(QString(), list.toXML("bad root"));
+    EXPECT_EQ(QString(), list.toXML(""));
+    EXPECT_EQ(QString(), list.toXML("<R>"));
+    const std::vector<std::string> lines = trace.orvLines();
+    ASSERT_EQ(3u, lines.size());
+    EXPECT_EQ("ZEL: Zel_SettingList::toXML: root name \"bad root\" is not a valid XML name; no document written",
+              lines[0]);
+}
+
+TEST(Zel_SettingListTest, ValuesRoundTripWithCharactersXmlCannotCarryRemoved)
+{
+    const QString markup = QStringLiteral("<tag attr=\"v\"> & 'q' ]]> &amp;");
+    const QString lineBreaks = QStringLiteral("a\r\nb\rc\td\ne");
+    const QString nonAscii = QString::fromUtf8("Grüße 日本 \xF0\x9F\x98\x80 end");
+    QString controls = QStringLiteral("x");
+    controls += QChar(0x01);
+    controls += QChar(0x1B);
+    controls += QChar(0xFFFE);
+    controls += QChar(0xFFFF);
+    controls += QChar(0xD800); // high surrogate without its low half
+    controls += QStringLiteral("y");
+    controls += QChar(0xDC00); // low surrogate alone
+    controls += QChar(char16_t(0));
+
+    Zel_SettingList list;
+    list.append(Zel_Setting("markup", markup));
+    list.append(Zel_Setting("breaks", lineBreaks));
+    list.append(Zel_Setting("unicode", nonAscii));
+    list.append(Zel_Setting("controls", controls));
+    list.append(Zel_Setting(QString::fromUtf8("Einstellung.Größe.日本"), "named"));
+
+    const QDomElement root = parse(list.toXML("R"));
+    EXPECT_EQ(markup, root.firstChildElement("markup").text());
+    EXPECT_EQ(lineBreaks, root.firstChildElement("breaks").text());
+    EXPECT_EQ(nonAscii, root.firstChildElement("unicode").text());
+    EXPECT_EQ(QStringLiteral("xy"), root.firstChildElement("controls").text());
+    EXPECT_EQ(QStringLiteral("named"), root.firstChildElement("Einstellung")
+                                           .firstChildElement(QString::fromUtf8("Größe"))
+                                           .firstChildElement(QString::fromUtf8("日本"))
+                                           .text());
+}
+
+TEST(Zel_SettingListTest, WideListsAreBuiltInLinearTime)
+{
+    // 100,000 settings: half directly under the root, half under one shared
+    // parent. A scan of all children per key would take minutes.
+    const int count = 100000;
+    Zel_SettingList list;
+    list.reserve(count);
+    for (int i = 0; i < count / 2; ++i) {
+        list.append(Zel_Setting(QStringLiteral("k%1").arg(i), QString::number(i)));
+        list.append(Zel_Setting(QStringLiteral("group.g%1").arg(i), QString::number(i)));
+    }
+
+    QElapsedTimer timer;
+    timer.start();
+    const QString xml = list.toXML("R");
+    const qint64 elapsed = timer.elapsed();
+    EXPECT_LT(elapsed, 30000) << "toXML of " << count << " settings took " << elapsed << " ms";
+
+    const QDomElement root = parse(xml);
+    EXPECT_EQ(count / 2 + 1, root.childNodes().count());
+    const QDomElement group = root.firstChildElement("group");
+    EXPECT_EQ(count / 2, group.childNodes().count());
+    EXPECT_EQ(QStringLiteral("0"), group.firstChildElement("g0").text());
+    EXPECT_EQ(QString::number(count / 2 - 1), group.lastChildElement().text());
+    EXPECT_EQ(QString::number(count / 2 - 1), root.lastChildElement().text());
+}
