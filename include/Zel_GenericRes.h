@@ -69,8 +69,8 @@ public:
         const Derived& self = derived();
         if (self.mCursor >= self.mItems.size())
             return true;
-        const boost::shared_ptr<Zel_Error>& error = self.mItems[static_cast<std::size_t>(self.mCursor)].mError;
-        return error && error->isError();
+        const auto& item = self.mItems[static_cast<std::size_t>(self.mCursor)];
+        return item.mError && item.mError->isError();
     }
 
     // Consumes the current item and hands it to the failure handler.

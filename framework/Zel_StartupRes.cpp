@@ -1,0 +1,35 @@
+#include "Zel_StartupRes.h"
+
+#include "zel_resultitems_p.h"
+
+#include <utility>
+
+Zel_StartupRes::Zel_StartupRes(boost::shared_ptr<Zel_StartupCB> callback, bool finalResult)
+    : Orv_Result(callback, finalResult)
+    , mCallback(std::move(callback))
+{
+}
+
+Zel_StartupRes::Zel_StartupRes(const Zel_StartupRes& other) = default;
+Zel_StartupRes& Zel_StartupRes::operator=(const Zel_StartupRes& other) = default;
+Zel_StartupRes::~Zel_StartupRes() = default;
+
+bool Zel_StartupRes::deliverNext()
+{
+    try {
+        if (mCallback && mError) {
+            if (mError->isError())
+                mCallback->failed(mError);
+            else
+                mCallback->succeeded();
+        }
+    } catch (...) {
+        // A handler's exception is discarded.
+    }
+    return false;
+}
+
+void Zel_StartupRes::setError(boost::shared_ptr<Zel_Error> error)
+{
+    mError = ZelResults::errorRecord(std::move(error));
+}
