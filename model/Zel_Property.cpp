@@ -67,9 +67,11 @@ bool Zel_Property::operator!=(const Zel_Property& other) const
 
 Zel_Property::operator QString() const
 {
-    return QStringLiteral("Zel_Property(") + mKey + QLatin1Char(':') + mValue + QLatin1Char(':')
-        + displayName(boost::shared_ptr<Zel_PropertyManager>()) + QLatin1Char(':')
-        + internalName(boost::shared_ptr<Zel_PropertyManager>()) + QLatin1Char(')');
+    // Ask in a fixed order: display name, then internal name.
+    const QString display = displayName(boost::shared_ptr<Zel_PropertyManager>());
+    const QString internal = internalName(boost::shared_ptr<Zel_PropertyManager>());
+    return QStringLiteral("Zel_Property(") + mKey + QLatin1Char(':') + mValue + QLatin1Char(':') + display
+        + QLatin1Char(':') + internal + QLatin1Char(')');
 }
 
 QString Zel_Property::displayName(boost::shared_ptr<Zel_PropertyManager> manager) const

@@ -1,6 +1,6 @@
 #include "Zel_PropertyList.h"
 
-#include <QStringList>
+#include <utility>
 
 Zel_PropertyList::Zel_PropertyList() = default;
 Zel_PropertyList::Zel_PropertyList(const Zel_PropertyList& other) = default;
@@ -30,7 +30,7 @@ bool Zel_PropertyList::eraseByKey(const QString& key)
 void Zel_PropertyList::addIfKeyNotInList(const Zel_Property& property)
 {
     const QString key = property.key();
-    for (const Zel_Property& existing : qAsConst(*this)) {
+    for (const Zel_Property& existing : std::as_const(*this)) {
         if (existing.key() == key)
             return;
     }
