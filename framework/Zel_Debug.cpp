@@ -53,7 +53,10 @@ void Zel_Debug::debug(const QString& source, const QString& text, int elapsedMs)
 
     const QString stamped = QLatin1Char('[') + QDateTime::currentDateTime().toString(Qt::TextDate)
         + QLatin1Char(']') + line;
-    // Passed as an argument, never as the format: percent signs stay as they are.
-    qDebug("%s", stamped.toLatin1().constData());
+    // Both outputs carry the Latin-1 form of the line (characters beyond
+    // Latin-1 become '?'). The debug output gets it as a string, never as a
+    // format, so percent signs stay as they are; going through QString keeps
+    // Latin-1 letters intact on a UTF-8 terminal.
+    qDebug().noquote() << QString::fromLatin1(stamped.toLatin1());
     Orv::log(line.toLatin1().constData());
 }
