@@ -13,6 +13,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <string>
 
 namespace {
@@ -373,4 +374,47 @@ TEST(Zel_SettingListTest, WideListsAreBuiltInLinearTime)
     EXPECT_EQ(QStringLiteral("0"), group.firstChildElement("g0").text());
     EXPECT_EQ(QString::number(count / 2 - 1), group.lastChildElement().text());
     EXPECT_EQ(QString::number(count / 2 - 1), root.lastChildElement().text());
+}
+
+TEST(Zel_SettingListTest, EveryCharacterInKeysAndValuesGivesWellFormedXml)
+{
+    // Each UTF-16 code unit as the first and as a later character of a key
+    // and inside a value: whatever is kept must parse back; values keep
+    // exactly the characters XML 1.0 can carry.
+    TraceCapture quiet(false);
+    int keptStarts = 0;
+    for (int block = 0; block < 0x10000; block += 0x400) {
+        Zel_SettingList list;
+        QString value;
+        QString expected;
+        for (int u = std::max(block, 1); u < block + 0x400; ++u) {
+            const QChar c(static_cast<char16_t>(u));
+            list.append(Zel_Setting(QString(c) + QStringLiteral("s"), "start"));
+            list.append(Zel_Setting(QStringLiteral("i") + c, "inner"));
+            value += c;
+            const bool carried = (u >= 0x20 || u == 0x9 || u == 0xA || u == 0xD)
+                && (u < 0xD800 || u > 0xDFFF) && u != 0xFFFE && u != 0xFFFF;
+            if (carried)
+                expected += c;
+        }
+        list.append(Zel_Setting("value", value));
+
+        const QDomElement root = parse(list.toXML("R"));
+        ASSERT_FALSE(root.isNull()) << "block " << block;
+        EXPECT_EQ(expected, root.lastChildElement("value").text()) << "block " << block;
+        for (QDomElement child = root.firstChildElement(); !child.isNull(); child = child.nextSiblingElement()) {
+            if (child.text() == QLatin1String("start"))
+                ++keptStarts;
+        }
+    }
+    // Letters of many scripts are kept, not only ASCII ones.
+    EXPECT_GT(keptStarts, 30000);
+
+    const QDomElement root =
+        parse(settings({{"_", "1"}, {"a-b.c_d.e1", "2"}, {"xmlns", "3"}, {"É.日本.ß", "4"}}).toXML("R"));
+    EXPECT_EQ((QStringList{"_", "a-b", "xmlns", "É"}), childNames(root));
+    EXPECT_EQ(QStringLiteral("4"), root.firstChildElement("É")
+                                       .firstChildElement(QString::fromUtf8("日本"))
+                                       .firstChildElement(QString::fromUtf8("ß"))
+                                       .text());
 }
