@@ -228,11 +228,31 @@ private:
         const QString usersPath = dot(base, QStringLiteral("users"));
         const QJsonObject users = optObject(settings, QStringLiteral("users"), usersPath);
         for (auto it = users.begin(); it != users.end(); ++it) {
+            const QString userPath = dot(usersPath, it.key());
             if (!mTree.user(it.key()))
-                fail(dot(usersPath, it.key()), QStringLiteral("no user is named \"%1\"").arg(it.key()));
+                fail(userPath, QStringLiteral("no user is named \"%1\"").arg(it.key()));
             if (!it.value().isObject())
-                fail(dot(usersPath, it.key()), QStringLiteral("expected an object"));
-            mTree.userSettings.insert(it.key(), readPairs(it.value().toObject(), dot(usersPath, it.key())));
+                fail(userPath, QStringLiteral("expected an object"));
+            const QJsonObject types = it.value().toObject();
+            QMap<int, SettingPairs> byType;
+            for (auto t = types.begin(); t != types.end(); ++t) {
+                int type = 0;
+                while (type < 3 && t.key() != QLatin1String(userSettingsTypeName(type)))
+                    ++type;
+                if (type == 3)
+                    fail(dot(userPath, t.key()), QStringLiteral("unknown settings type (expected general, project or site)"));
+                if (!t.value().isObject())
+                    fail(dot(userPath, t.key()), QStringLiteral("expected an object"));
+                byType.insert(type, readPairs(t.value().toObject(), dot(userPath, t.key())));
+            }
+            mTree.userSettings.insert(it.key(), byType);
+        }
+        const QString docsPath = dot(base, QStringLiteral("documents"));
+        const QJsonObject docs = optObject(settings, QStringLiteral("documents"), docsPath);
+        for (auto it = docs.begin(); it != docs.end(); ++it) {
+            if (!it.value().isString())
+                fail(dot(docsPath, it.key()), QStringLiteral("expected a string"));
+            mTree.documents.insert(it.key(), it.value().toString());
         }
     }
 
@@ -614,9 +634,17 @@ QByteArray saveTree(const Tree& tree)
         apps.insert(it.key(), pairsToObject(it.value()));
     settings.insert(QStringLiteral("applications"), apps);
     QJsonObject userSettings;
-    for (auto it = tree.userSettings.constBegin(); it != tree.userSettings.constEnd(); ++it)
-        userSettings.insert(it.key(), pairsToObject(it.value()));
+    for (auto it = tree.userSettings.constBegin(); it != tree.userSettings.constEnd(); ++it) {
+        QJsonObject types;
+        for (auto t = it.value().constBegin(); t != it.value().constEnd(); ++t)
+            types.insert(QLatin1String(userSettingsTypeName(t.key())), pairsToObject(t.value()));
+        userSettings.insert(it.key(), types);
+    }
     settings.insert(QStringLiteral("users"), userSettings);
+    QJsonObject docs;
+    for (auto it = tree.documents.constBegin(); it != tree.documents.constEnd(); ++it)
+        docs.insert(it.key(), it.value());
+    settings.insert(QStringLiteral("documents"), docs);
     top.insert(QStringLiteral("settings"), settings);
 
     if (!tree.linkedProjects.isEmpty())

@@ -60,6 +60,38 @@ Zel_PropertyKeyInfo keyInfo(const KeyDesc& k)
                                static_cast<Zel_PropertyKeyType>(k.type), k.textSearchable, k.hasCustomValues);
 }
 
+const char* userSettingsTypeName(int type)
+{
+    switch (type) {
+    case 0:
+        return "general";
+    case 1:
+        return "project";
+    case 2:
+        return "site";
+    default:
+        return "";
+    }
+}
+
+Zel_PropertyList nodeProperties(const Tree& tree, const Node& node)
+{
+    Q_UNUSED(tree);
+    Zel_PropertyList list;
+    list.append(Zel_Property(QStringLiteral("Name"), node.name, QString()));
+    list.append(Zel_Property(QStringLiteral("Mime Type"), node.mimeType, QString()));
+    if (!node.mobId.isEmpty())
+        list.append(Zel_Property(QStringLiteral("MobID"), node.mobId, QString()));
+    for (const Property& p : node.properties)
+        list.append(Zel_Property(p.key, p.value, p.customValues));
+    if (!node.reservation.user.isEmpty()) {
+        list.addIfKeyNotInList(Zel_Property(QStringLiteral("Locked By"), node.reservation.user, QString()));
+        if (node.reservation.since.isValid())
+            list.addIfKeyNotInList(Zel_Property(QStringLiteral("Locked On"), node.reservation.since.toString(Qt::ISODate), QString()));
+    }
+    return list;
+}
+
 Observer::~Observer() = default;
 
 Tree::Tree() = default;

@@ -23,6 +23,7 @@
 #include <QStringList>
 
 #include "Zel_PropertyKeyInfo.h"
+#include "Zel_PropertyList.h"
 
 #include <boost/shared_ptr.hpp>
 #include <boost/weak_ptr.hpp>
@@ -163,6 +164,10 @@ struct Resolution {
 
 typedef QList<QPair<QString, QString>> SettingPairs;
 
+// The names of the user settings types in tree files ("general", "project",
+// "site"), by Zel_GetUserSettingsCB::UserSettingsType value 0, 1, 2.
+const char* userSettingsTypeName(int type);
+
 struct QStringHash {
     std::size_t operator()(const QString& s) const { return qHash(s); }
 };
@@ -199,7 +204,8 @@ public:
     QList<KeyDesc> keys;
     QList<Resolution> resolutions;
     QMap<QString, SettingPairs> applicationSettings; // application -> settings
-    QMap<QString, SettingPairs> userSettings;        // user -> settings
+    QMap<QString, QMap<int, SettingPairs>> userSettings; // user -> settings type -> settings
+    QMap<QString, QString> documents;                   // named settings documents (XML)
     SettingPairs workgroupSettings;
     QStringList linkedProjects; // monikers
     std::uint64_t serial = 0;  // for new node IDs
@@ -297,6 +303,10 @@ private:
     std::vector<Change> mChanges;
     bool mReleased = false;
 };
+
+// The properties a node shows: Name, Mime Type, MobID (media only), the
+// stored properties, and Locked By / Locked On while it is reserved.
+Zel_PropertyList nodeProperties(const Tree& tree, const Node& node);
 
 // Loading and saving (memory_json.cpp). load() answers false with a message
 // that names the source and the position (line and column for syntax errors,

@@ -1,0 +1,309 @@
+#include "memory_session_p.h"
+
+#include "Zel_MemoryNode.h"
+
+#include "Zel_EventCB.h"
+#include "Zel_EventChildUpdated.h"
+#include "Zel_EventRes.h"
+#include "Zel_MimeTypeSpec.h"
+#include "Zel_NodeListener.h"
+#include "Zel_Session.h"
+
+namespace ZelMemory {
+
+namespace {
+
+const unsigned long ContainerMask = 0x7E00; // project, bin, folder, catalog, workspace, playbackdevices
+const unsigned long MediaMask = 0x1981FF;
+
+boost::shared_ptr<QString> shared(const QString& text)
+{
+    return boost::shared_ptr<QString>(new QString(text));
+}
+
+} // namespace
+
+void fail(Zel_MemoryErrorCodes::Code code, const QString& message)
+{
+    throw Failure{Zel_MemoryError::make(code, message)};
+}
+
+Cancelable::~Cancelable() = default;
+
+// --- SessionObserver --------------------------------------------------------
+
+SessionObserver::SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub,
+                                 const boost::shared_ptr<Orv_ResultQ>& resultQ)
+    : mHub(hub)
+    , mResultQ(resultQ)
+    , mNodeListener(new Zel_NodeListener(hub, resultQ))
+{
+}
+
+SessionObserver::~SessionObserver() = default;
+
+void SessionObserver::treeChanged(const std::vector<Change>& changes)
+{
+    for (const Change& change : changes) {
+        const boost::shared_ptr<QString> parent = shared(change.parentMoniker);
+        const boost::shared_ptr<QString> child = shared(change.childMoniker);
+        switch (change.kind) {
+        case Change::Added:
+            mNodeListener->NodeAdded(parent, child);
+            break;
+        case Change::Removed:
+            mNodeListener->NodeRemoved(parent, child);
+            break;
+        case Change::Updated:
+            // The node listener has no report for an updated child; the same
+            // rule by hand: an event only when someone listens for the parent.
+            if (mHub && mResultQ && mHub->hasRegisteredListener(parent)) {
+                boost::shared_ptr<Zel_Event> event(new Zel_EventChildUpdated(parent, child));
+                mResultQ->Push(boost::shared_ptr<Orv_Result>(new Zel_EventRes(mHub, event)));
+            }
+            break;
+        }
+    }
+}
+
+// --- SessionState -------------------------------------------------------------
+
+QString SessionState::user() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mUser;
+}
+
+void SessionState::setLogin(const QString& user, const QString& sessionID, const QDateTime& time)
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    mUser = user;
+    mSessionID = sessionID;
+    mLoginTime = time;
+}
+
+void SessionState::clearLogin()
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    mUser.clear();
+    mSessionID.clear();
+    mLoginTime = QDateTime();
+}
+
+QString SessionState::sessionID() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mSessionID;
+}
+
+QDateTime SessionState::loginTime() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mLoginTime;
+}
+
+void SessionState::setOwner(const Zel_Session* owner)
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    mOwner = owner;
+}
+
+bool SessionState::isValidAssetName(const QString& name) const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mOwner && mOwner->isValidAssetName(name);
+}
+
+bool SessionState::isValidPropertyName(const QString& name) const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mOwner && mOwner->isValidPropertyName(name);
+}
+
+QString SessionState::illegalAssetCharacters() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mOwner ? mOwner->illegalAssetNameCharacters() : QString();
+}
+
+bool SessionState::sessionAlive() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mOwner != nullptr;
+}
+
+void SessionState::track(const boost::shared_ptr<Cancelable>& request)
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    for (auto it = mRequests.begin(); it != mRequests.end();) {
+        if (it->expired())
+            it = mRequests.erase(it);
+        else
+            ++it;
+    }
+    mRequests.push_back(request);
+}
+
+void SessionState::cancelAll()
+{
+    std::vector<boost::shared_ptr<Cancelable>> live;
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        for (const boost::weak_ptr<Cancelable>& weak : mRequests) {
+            if (boost::shared_ptr<Cancelable> request = weak.lock())
+                live.push_back(request);
+        }
+        mRequests.clear();
+    }
+    for (const boost::shared_ptr<Cancelable>& request : live)
+        request->cancel();
+}
+
+// --- Work -----------------------------------------------------------------------
+
+Work::Work(SessionState& s, bool needsLogin)
+    : session(s)
+    , tree(s.tree->data())
+    , user(s.user())
+{
+    if (session.closed.load() || !session.sessionAlive())
+        fail(Zel_MemoryErrorCodes::NotConnected, QStringLiteral("The session is closed."));
+    if (!session.connected.load())
+        fail(Zel_MemoryErrorCodes::NotConnected,
+             QStringLiteral("The connection to the server is lost; the request was not carried out."));
+    if (needsLogin && user.isEmpty())
+        fail(Zel_MemoryErrorCodes::NotLoggedIn, QStringLiteral("Log in first: the request needs a user."));
+}
+
+QString Work::describe(const Node& n) const
+{
+    return QStringLiteral("\"%1\" (%2)").arg(n.name, n.moniker);
+}
+
+Node& Work::node(const boost::shared_ptr<QString>& moniker)
+{
+    if (!moniker || moniker->isEmpty())
+        fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No moniker was given."));
+    Node* found = tree.byMoniker(*moniker);
+    if (!found)
+        fail(Zel_MemoryErrorCodes::UnknownMoniker, QStringLiteral("No node has the moniker \"%1\".").arg(*moniker));
+    require(*found, PermRead, QStringLiteral("read"));
+    return *found;
+}
+
+Node& Work::nodeAtPath(const QStringList& names, bool rooted)
+{
+    Q_UNUSED(rooted); // paths are always taken from the root
+    const QString text = QLatin1Char('/') + names.join(QLatin1Char('/'));
+    const Node* found = tree.byId(tree.rootId);
+    for (const QString& name : names) {
+        if (!found)
+            break;
+        found = tree.childNamed(*found, name);
+    }
+    if (!found)
+        fail(Zel_MemoryErrorCodes::UnknownMoniker, QStringLiteral("No node is at the path \"%1\".").arg(text));
+    Node* n = tree.byId(found->id);
+    require(*n, PermRead, QStringLiteral("read"));
+    return *n;
+}
+
+Node& Work::nodeOfMob(const QString& mobID)
+{
+    if (mobID.isEmpty())
+        fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media object ID was given."));
+    for (auto& entry : tree.nodes) {
+        if (entry.second.mobId == mobID) {
+            require(entry.second, PermRead, QStringLiteral("read"));
+            return entry.second;
+        }
+    }
+    fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("No media object has the ID \"%1\".").arg(mobID));
+}
+
+void Work::require(const Node& n, std::uint32_t permission, const QString& action)
+{
+    if ((tree.permissionsOf(user, n) & permission) == permission)
+        return;
+    QStringList names = permissionNames(permission);
+    fail(Zel_MemoryErrorCodes::PermissionDenied,
+         QStringLiteral("User \"%1\" may not %2 %3 (missing permission: %4).")
+             .arg(user, action, describe(n), names.join(QStringLiteral(", "))));
+}
+
+void Work::requireNotReservedByOther(const Node& n, const QString& action)
+{
+    const Node* reserved = tree.reservedByOther(n, user);
+    if (!reserved)
+        return;
+    if (reserved->id == n.id)
+        fail(Zel_MemoryErrorCodes::ReservedByOtherUser,
+             QStringLiteral("Cannot %1 %2: it is reserved by \"%3\".").arg(action, describe(n), reserved->reservation.user));
+    fail(Zel_MemoryErrorCodes::ReservedByOtherUser,
+         QStringLiteral("Cannot %1 %2: %3 below it is reserved by \"%4\".")
+             .arg(action, describe(n), describe(*reserved), reserved->reservation.user));
+}
+
+void Work::requireFolder(const Node& n)
+{
+    if (!Zel_MimeTypeSpec(ContainerMask).isType(n.mimeType))
+        fail(Zel_MemoryErrorCodes::NotAFolder,
+             QStringLiteral("%1 is a %2, not a folder.").arg(describe(n), n.mimeType));
+}
+
+void Work::requireMedia(const Node& n)
+{
+    if (!Zel_MimeTypeSpec(MediaMask).isType(n.mimeType))
+        fail(Zel_MemoryErrorCodes::NotMedia, QStringLiteral("%1 is a %2, not a media asset.").arg(describe(n), n.mimeType));
+}
+
+void Work::requireAssetName(const QString& name)
+{
+    if (name.size() > MaxNameLength)
+        fail(Zel_MemoryErrorCodes::InvalidName,
+             QStringLiteral("The name \"%1...\" is longer than %2 characters.").arg(name.left(20)).arg(MaxNameLength));
+    if (!session.isValidAssetName(name))
+        fail(Zel_MemoryErrorCodes::InvalidName,
+             QStringLiteral("The session rejects the name \"%1\": it needs a letter, digit or underscore and none of "
+                            "the characters %2.")
+                 .arg(name, session.illegalAssetCharacters()));
+}
+
+void Work::requireFreeName(const Node& parent, const QString& name, const Node* except)
+{
+    const Node* existing = tree.childNamed(parent, name);
+    if (existing && (!except || existing->id != except->id))
+        fail(Zel_MemoryErrorCodes::NameExists,
+             QStringLiteral("%1 already holds a node named \"%2\".").arg(describe(parent), name));
+}
+
+boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n)
+{
+    Zel_MemoryNode::Snapshot s;
+    s.moniker = n.moniker;
+    s.masterMoniker = n.masterMoniker;
+    s.nodeID = n.id;
+    if (const Node* parent = tree.parentOf(n))
+        s.parentNodeID = parent->id;
+    s.childrenCount = static_cast<unsigned long>(n.children.size());
+    s.name = n.name;
+    s.mimeType = n.mimeType;
+    s.mobID = n.mobId;
+    s.path = tree.pathOf(n);
+    s.reservedBy = n.reservation.user;
+    s.reservedSince = n.reservation.since;
+    s.reservedUntil = n.reservation.until;
+    for (const Node* p = &n; p; p = tree.parentOf(*p)) {
+        if (p->mimeType == QLatin1String("project") && !tree.propertyValue(*p, QStringLiteral("SyncedProject_GUID")).isEmpty()) {
+            s.syncedProject = true;
+            break;
+        }
+    }
+    s.userPlaced = n.userPlaced;
+    s.dropTarget = Zel_MimeTypeSpec(ContainerMask).isType(n.mimeType)
+        && (tree.permissionsOf(user, n) & (PermAddFiles | PermAddFolders)) != 0;
+    s.properties = nodeProperties(tree, n);
+    return boost::shared_ptr<Zel_Node>(new Zel_MemoryNode(s, session.tree));
+}
+
+} // namespace ZelMemory

@@ -1,0 +1,216 @@
+// Internal: what the requests of a memory session share, and the one piece of
+// plumbing every request goes through.
+//
+// SessionState is the session's data, shared by the session and by every
+// request it made (a request may outlive its session). Work is the context of
+// one request's work: it checks the connection and the login once, and offers
+// the lookups and checks every operation needs, each of which throws a
+// Failure carrying the error record. runOperation() builds the operation's
+// result, runs the operation and, when it throws, replaces whatever was
+// collected by a fresh result holding only the failure. Operations validate
+// everything before they change the tree, so a failure leaves it unchanged.
+#ifndef MEMORY_SESSION_P_H
+#define MEMORY_SESSION_P_H
+
+#include "memory_tree_p.h"
+#include "Zel_MemoryError.h"
+#include "Zel_MemoryErrorCodes.h"
+#include "Zel_MemoryTree.h"
+
+#include "Zel_Req.h"
+#include "Orv_Request.h"
+#include "Orv_ResultQ.h"
+
+#include <QDateTime>
+#include <QString>
+#include <boost/shared_ptr.hpp>
+#include <boost/weak_ptr.hpp>
+
+#include <atomic>
+#include <memory>
+#include <mutex>
+#include <vector>
+
+class Orv_Engine;
+class Zel_EventCB;
+class Zel_Node;
+class Zel_NodeListener;
+class Zel_Session;
+
+namespace ZelMemory {
+
+struct Failure {
+    boost::shared_ptr<Zel_Error> error;
+};
+
+[[noreturn]] void fail(Zel_MemoryErrorCodes::Code code, const QString& message);
+
+// A request that can be cancelled by its session.
+class Cancelable
+{
+public:
+    virtual ~Cancelable();
+    virtual void cancel() = 0;
+};
+
+// Hands the tree's changes to one session's listeners: added and removed
+// children through a Zel_NodeListener, updated children as child-updated
+// events under the same rule (only when someone listens for the parent).
+class SessionObserver : public Observer
+{
+public:
+    SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub, const boost::shared_ptr<Orv_ResultQ>& resultQ);
+    ~SessionObserver() override;
+    void treeChanged(const std::vector<Change>& changes) override;
+
+private:
+    boost::shared_ptr<Zel_EventCB> mHub;
+    boost::shared_ptr<Orv_ResultQ> mResultQ;
+    std::unique_ptr<Zel_NodeListener> mNodeListener;
+};
+
+class SessionState
+{
+public:
+    boost::shared_ptr<Zel_MemoryTree> tree;
+    Orv_Engine* engine = nullptr;
+    boost::shared_ptr<Orv_ResultQ> resultQ;
+    QString applicationName;
+    std::atomic<bool> connected{true};
+    std::atomic<bool> closed{false};
+
+    // The logged-in user and the login's identity.
+    QString user() const;
+    void setLogin(const QString& user, const QString& sessionID, const QDateTime& time);
+    void clearLogin();
+    QString sessionID() const;
+    QDateTime loginTime() const;
+
+    // Name validation through the session (while it lives).
+    void setOwner(const Zel_Session* owner);
+    bool isValidAssetName(const QString& name) const;
+    bool isValidPropertyName(const QString& name) const;
+    bool sessionAlive() const;
+    QString illegalAssetCharacters() const;
+
+    void track(const boost::shared_ptr<Cancelable>& request);
+    void cancelAll();
+
+private:
+    mutable std::mutex mMutex;
+    QString mUser;
+    QString mSessionID;
+    QDateTime mLoginTime;
+    const Zel_Session* mOwner = nullptr;
+    std::vector<boost::weak_ptr<Cancelable>> mRequests;
+};
+
+const int MaxNameLength = 128;
+
+// The context of one request's work.
+class Work
+{
+public:
+    // Throws NotConnected when the connection is down or the session closed,
+    // NotLoggedIn when the operation needs a user and none is logged in.
+    Work(SessionState& session, bool needsLogin);
+
+    SessionState& session;
+    Tree& tree;
+    QString user;
+
+    // --- Lookups and checks; the caller holds the tree. ---
+    Node& node(const boost::shared_ptr<QString>& moniker);
+    Node& nodeAtPath(const QStringList& names, bool rooted);
+    Node& nodeOfMob(const QString& mobID);
+    void require(const Node& node, std::uint32_t permission, const QString& action);
+    void requireNotReservedByOther(const Node& node, const QString& action);
+    void requireFolder(const Node& node);
+    void requireMedia(const Node& node);
+    void requireAssetName(const QString& name);
+    void requireFreeName(const Node& parent, const QString& name, const Node* except = nullptr);
+    QString describe(const Node& node) const; // "\"Footage\" (zel-mem://B-FOOTAGE)"
+
+    // A snapshot of the node for the application.
+    boost::shared_ptr<Zel_Node> snapshot(const Node& node);
+};
+
+// Runs an operation into a new final result of its result class.
+template <class Op>
+boost::shared_ptr<Orv_Result> runOperation(SessionState& session, const boost::shared_ptr<typename Op::Callback>& callback,
+                                           const typename Op::Args& args)
+{
+    typedef typename Op::Result Result;
+    boost::shared_ptr<Result> result(new Result(callback, true));
+    try {
+        Work work(session, Op::NeedsLogin);
+        Op::run(work, args, *result);
+    } catch (const Failure& failure) {
+        result.reset(new Result(callback, true));
+        failInto(*result, failure.error);
+    }
+    return result;
+}
+
+// A concrete request of the request class Base, doing Op's work.
+template <class Base, class Op>
+class Request : public Base, public Cancelable
+{
+public:
+    Request(const boost::shared_ptr<typename Op::Callback>& callback, const boost::shared_ptr<SessionState>& session,
+            const typename Op::Args& args)
+        : Base(callback)
+        , mCallback(callback)
+        , mSession(session)
+        , mArgs(args)
+    {
+    }
+
+    bool doProcess(boost::shared_ptr<Orv_Result>& result) override
+    {
+        result = Op::execute(*mSession, mCallback, mArgs);
+        return true;
+    }
+    void cancel() override { this->setCanceled(true); }
+
+private:
+    boost::shared_ptr<typename Op::Callback> mCallback;
+    boost::shared_ptr<SessionState> mSession;
+    typename Op::Args mArgs;
+};
+
+// The same for the three request classes on Orv_Request, which implement
+// process themselves: run the work and push its result.
+template <class Base, class Op>
+class DirectRequest : public Base, public Cancelable
+{
+public:
+    DirectRequest(const boost::shared_ptr<typename Op::Callback>& callback,
+                  const boost::shared_ptr<SessionState>& session, const typename Op::Args& args)
+        : Base(callback)
+        , mCallback(callback)
+        , mSession(session)
+        , mArgs(args)
+    {
+    }
+
+    bool process(boost::shared_ptr<Orv_ResultQ> resultQ) override
+    {
+        if (!resultQ)
+            return false;
+        const boost::shared_ptr<Orv_Result> result = Op::execute(*mSession, mCallback, mArgs);
+        if (result)
+            resultQ->Push(result);
+        return true;
+    }
+    void cancel() override { this->setCanceled(true); }
+
+private:
+    boost::shared_ptr<typename Op::Callback> mCallback;
+    boost::shared_ptr<SessionState> mSession;
+    typename Op::Args mArgs;
+};
+
+} // namespace ZelMemory
+
+#endif
