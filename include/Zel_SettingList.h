@@ -23,8 +23,9 @@
 // element name that is not a valid XML name, is left out (the latter with a
 // trace line), as is the value of a key ending in "."; characters that XML 1.0
 // cannot carry are removed from values; an invalid root name gives an empty
-// text. Element names follow the XML 1.0 Name rules without ":" (no namespace
-// prefixes). The process-wide QDom settings are left untouched.
+// text. Element names are limited to what every XML 1.0 reader accepts: the
+// XML letters, digits and marks of the Basic Multilingual Plane, '_', '-' and
+// '.' (not first), never ':'. The process-wide QDom settings are untouched.
 // A plain value: no locks.
 #ifndef ZEL_SETTINGLIST_H
 #define ZEL_SETTINGLIST_H
