@@ -583,6 +583,11 @@ bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QSt
     return true;
 }
 
+QByteArray nodeJson(const Tree& tree, const Node& node)
+{
+    return QJsonDocument(nodeToJson(tree, node)).toJson(QJsonDocument::Compact);
+}
+
 QByteArray saveTree(const Tree& tree)
 {
     QJsonObject top;

@@ -189,8 +189,11 @@ ZEL_MEMORY_OPERATION(QueryOp, Zel_QueryCB, MemoryRes<Zel_QueryCB>, true, boost::
 ZEL_MEMORY_OPERATION(PropertyListOp, Zel_PropertyListCB, MemoryRes<Zel_PropertyListCB>, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(GetPropertiesOp, Zel_PropertyListCB, MemoryRes<Zel_PropertyListCB>, true, MonikerSP moniker;
                      QStringList keys;)
+// conditional: the callback is a Zel_ConditionalSetPropertiesCB; each
+// property's custom values text then holds the value the application expects
+// the property to have now.
 ZEL_MEMORY_OPERATION(SetPropertiesOp, Zel_SetPropertiesCB, MemoryRes<Zel_SetPropertiesCB>, true, MonikerSP moniker;
-                     Zel_PropertyList properties;)
+                     Zel_PropertyList properties; bool conditional;)
 ZEL_MEMORY_OPERATION(CreatePropertyOp, Zel_CreatePropertyCB, MemoryRes<Zel_CreatePropertyCB>, true,
                      MonikerSP moniker; Zel_Property property;)
 ZEL_MEMORY_OPERATION(MediaResolutionsOp, Zel_MediaResolutionsCB, Zel_MediaResolutionsRes, true, int unused;)

@@ -231,9 +231,9 @@ void Work::require(const Node& n, std::uint32_t permission, const QString& actio
              .arg(user, action, describe(n), names.join(QStringLiteral(", "))));
 }
 
-void Work::requireNotReservedByOther(const Node& n, const QString& action)
+void Work::requireNotReservedByOther(const Node& n, const QString& action, bool below)
 {
-    const Node* reserved = tree.reservedByOther(n, user);
+    const Node* reserved = tree.reservedByOther(n, user, below);
     if (!reserved)
         return;
     if (reserved->id == n.id)

@@ -124,7 +124,7 @@ public:
     Node& nodeAtPath(const QStringList& names, bool rooted);
     Node& nodeOfMob(const QString& mobID);
     void require(const Node& node, std::uint32_t permission, const QString& action);
-    void requireNotReservedByOther(const Node& node, const QString& action);
+    void requireNotReservedByOther(const Node& node, const QString& action, bool below = true);
     void requireFolder(const Node& node);
     void requireMedia(const Node& node);
     void requireAssetName(const QString& name);

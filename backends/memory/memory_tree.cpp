@@ -191,10 +191,12 @@ std::uint32_t Tree::permissionsOf(const QString& userName, const Node& node) con
     return 0;
 }
 
-const Node* Tree::reservedByOther(const Node& node, const QString& userName) const
+const Node* Tree::reservedByOther(const Node& node, const QString& userName, bool below) const
 {
-    if (!node.reservation.user.isEmpty() && node.reservation.user != userName)
+    if (node.reservation.isActive() && node.reservation.user != userName)
         return &node;
+    if (!below)
+        return nullptr;
     for (const QString& id : node.children) {
         if (const Node* child = byId(id)) {
             if (const Node* found = reservedByOther(*child, userName))

@@ -95,6 +95,8 @@ struct Reservation {
     QString user; // empty: not reserved
     QDateTime since;
     QDateTime until; // null: no end
+    // Held by someone and not yet expired.
+    bool isActive() const { return !user.isEmpty() && (!until.isValid() || until > QDateTime::currentDateTimeUtc()); }
 };
 
 // A frame locator or a frame restriction: an identifier and ordered properties.
@@ -228,8 +230,9 @@ public:
     // node (this one, then upwards) with an entry for the user, or for "*",
     // decides (the user's own entry wins over "*" on the same node).
     std::uint32_t permissionsOf(const QString& user, const Node& node) const;
-    // The first node at or below node reserved by someone other than user.
-    const Node* reservedByOther(const Node& node, const QString& user) const;
+    // The first node at (and, with below, under) node whose active
+    // reservation is held by someone other than user.
+    const Node* reservedByOther(const Node& node, const QString& user, bool below = true) const;
     // The child of parent named name (exact), or null.
     const Node* childNamed(const Node& parent, const QString& name) const;
     // name, or "name 2", "name 3", ... whichever no child of parent has.
@@ -313,6 +316,8 @@ Zel_PropertyList nodeProperties(const Tree& tree, const Node& node);
 // the path of the offending value for everything else).
 bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QString& error);
 QByteArray saveTree(const Tree& tree);
+// One node (and its subtree) in the form of the tree file.
+QByteArray nodeJson(const Tree& tree, const Node& node);
 
 } // namespace ZelMemory
 
