@@ -267,6 +267,8 @@ void ChildrenAtMonikerOp::run(Work& work, const Args& args, Result& result)
     ReadHold hold(work.tree);
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
+    if (args.callback)
+        args.callback->setParentNode(work.snapshot(parent));
     for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
         result.succeed(child);
 }

@@ -178,8 +178,9 @@ ZEL_MEMORY_OPERATION(DirOp, Zel_DirCB, MemoryRes<Zel_DirCB>, true, MonikerSP mon
 ZEL_MEMORY_OPERATION(GetChildrenOp, Zel_ResultCB, Zel_GetChildrenRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(ChildrenOp, Zel_ChildrenCB, Zel_ChildrenRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(ChildrenAtOp, Zel_ChildrenAtCB, MemoryRes<Zel_ChildrenAtCB>, true, Zel_Directory path;)
+// The callback is told the parent node (setParentNode) once it is found.
 ZEL_MEMORY_OPERATION(ChildrenAtMonikerOp, Zel_ChildrenAtMonikerCB, MemoryRes<Zel_ChildrenAtMonikerCB>, true,
-                     MonikerSP moniker;)
+                     MonikerSP moniker; boost::shared_ptr<Zel_ChildrenAtMonikerCB> callback;)
 ZEL_MEMORY_OPERATION(GetLinkedProjectsOp, Zel_ResultCB, Zel_GetLinkedProjectsRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(GetSyncedProjRootOp, Zel_ResultCB, Zel_GetSyncedProjRootRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(AssociationsOp, Zel_AssociationsCB, Zel_AssociationsRes, true, MonikerSP moniker;)
