@@ -1,0 +1,610 @@
+// End-to-end: every request class through the engine and its worker threads,
+// against the sample tree, with its answers, its failures and its events.
+#include "BackendRecorders.h"
+
+#include "Zel_Dependency.h"
+#include "Zel_DependencySPList.h"
+#include "Zel_GetNodeReq.h"
+#include "Zel_Property.h"
+#include "Zel_SettingList.h"
+
+#include <QDateTime>
+
+using namespace Sample;
+
+typedef BackendFixture Zel_MemorySessionTest;
+
+TEST_F(Zel_MemorySessionTest, RequestsBeforeLoginFailAndWrongPasswordIsRejected)
+{
+    boost::shared_ptr<Zel_MemorySession> anonymous = newSession(QString());
+    auto node = rec<NodeRec>();
+    run(anonymous->makeGetNodeReqSP(mk(m(Mayor)), node), anonymous);
+    EXPECT_EQ((QStringList{QStringLiteral("fail 1005"), QStringLiteral("finished")}), node->log);
+
+    auto login = rec<LoginRec>();
+    run(anonymous->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("wrong"), boost::shared_ptr<Zel_LoginCredentials>(), login),
+        anonymous);
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::LoginFailed}, login->codes);
+    EXPECT_FALSE(anonymous->isLoggedIn());
+
+    login = rec<LoginRec>();
+    run(anonymous->makeLoginReqSP(QStringLiteral("producer"), QStringLiteral("producer"), boost::shared_ptr<Zel_LoginCredentials>(), login),
+        anonymous);
+    EXPECT_EQ(QStringList{QStringLiteral("ok producer")}, login->log);
+    EXPECT_TRUE(anonymous->isLoggedIn());
+    EXPECT_EQ(QStringLiteral("producer"), anonymous->getUserName());
+    EXPECT_FALSE(anonymous->getSessionID().isEmpty());
+    EXPECT_TRUE(anonymous->getLoginTime().isValid());
+    anonymous->logout();
+    EXPECT_FALSE(anonymous->isLoggedIn());
+}
+
+TEST_F(Zel_MemorySessionTest, BrowsingRequestsAnswerNodesInNodeOrder)
+{
+    auto root = rec<RootNodeRec>();
+    run(session->makeRootNodeReqSP(root));
+    ASSERT_EQ(1, root->nodes.size());
+    EXPECT_EQ(m(Root), root->nodes[0]->getMoniker());
+    EXPECT_TRUE(root->nodes[0]->isFolder());
+    EXPECT_EQ(QStringList{QStringLiteral("ok Newsroom")}, root->log); // no finished handler
+
+    auto children = rec<NodeRec>();
+    run(session->makeGetChildrenReqSP(mk(m(Footage)), children));
+    // Media by mime type rank, then by name without regard to case.
+    EXPECT_EQ((QStringList{QStringLiteral("ok City Hall Exterior"), QStringLiteral("ok Interview Mayor"),
+                           QStringLiteral("ok traffic b-roll"), QStringLiteral("ok Crowd Atmosphere"),
+                           QStringLiteral("ok Mayor Soundbite"), QStringLiteral("finished")}),
+              children->log);
+    const NodeSP mayor = children->nodes[1];
+    EXPECT_EQ(m(Mayor), mayor->getMoniker());
+    EXPECT_EQ(QStringLiteral("C-MAYOR"), mayor->getNodeID());
+    EXPECT_EQ(QStringLiteral("B-FOOTAGE"), mayor->getParentNodeID());
+    EXPECT_EQ(QStringLiteral("/Evening News/Footage/Interview Mayor"), mayor->getPath().toZelString(QStringLiteral("/")));
+    EXPECT_EQ(QLatin1String(MayorMob), mayor->getMobID().toZelString());
+    EXPECT_EQ(QStringLiteral("CARD-0417"), mayor->getPropertyValue(QStringLiteral("Tape")));
+    EXPECT_EQ(QDateTime(QDate(2026, 3, 2), QTime(9, 15), Qt::UTC),
+              mayor->getPropertyValueAsDateTime(QStringLiteral("CreationDate")));
+    EXPECT_TRUE(mayor->isMedia());
+    EXPECT_TRUE(mayor->isValid());
+    EXPECT_EQ(m(Mayor), children->nodes[4]->getMasterMoniker());
+
+    auto flags = rec<ChildrenRec>();
+    run(session->makeChildrenReqSP(mk(m(News)), flags));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Archive +"), QStringLiteral("ok Effects +"), QStringLiteral("ok Footage +"),
+                           QStringLiteral("ok Sequences +"), QStringLiteral("finished")}),
+              flags->log);
+
+    auto at = rec<ChildrenAtRec>();
+    run(session->makeChildrenAtReqSP(Zel_Directory(QStringLiteral("/Evening News/Sequences"), QStringLiteral("/")), at));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Evening News 18-00"), QStringLiteral("ok Teaser"), QStringLiteral("finished")}), at->log);
+
+    auto atMoniker = rec<ChildrenAtMonikerRec>();
+    run(session->makeChildrenAtMonikerReqSP(mk(m(Sequences)), atMoniker));
+    EXPECT_EQ(3, atMoniker->log.size());
+    ASSERT_TRUE(atMoniker->getParentMoniker());
+    EXPECT_EQ(m(Sequences), *atMoniker->getParentMoniker());
+    ASSERT_TRUE(atMoniker->getParentNode());
+    EXPECT_EQ(QStringLiteral("Sequences"), atMoniker->getParentNode()->getName());
+
+    auto get = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Bulletin)), get));
+    ASSERT_EQ(1, get->nodes.size());
+    EXPECT_TRUE(get->nodes[0]->isReserved());
+    EXPECT_EQ(QStringLiteral("producer"), get->nodes[0]->getPropertyValue(QStringLiteral("Locked By")));
+
+    auto refresh = rec<RefreshNodeRec>();
+    run(session->makeRefreshNodeReqSP(mk(m(Footage)), refresh));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Footage"), QStringLiteral("finished")}), refresh->log);
+    EXPECT_TRUE(refresh->nodes[0]->isValidDropTarget());
+
+    auto byPath = rec<NodeCBRec>();
+    run(session->makeNodeReqSP(Zel_Directory(QStringLiteral("/Sports Tonight/Highlights"), QStringLiteral("/")), byPath));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Highlights"), QStringLiteral("finished")}), byPath->log);
+    EXPECT_TRUE(byPath->nodes[0]->isSyncedBin());
+    EXPECT_TRUE(byPath->nodes[0]->isSyncedFolder());
+
+    auto moniker = rec<MonikerRec>();
+    run(session->makeMonikerReqSP(Zel_Directory(QStringLiteral("/Evening News/Effects/Lower Third"), QStringLiteral("/")), moniker));
+    EXPECT_EQ((QStringList{QStringLiteral("ok zel-mem://E-LOWERTHIRD"), QStringLiteral("finished")}), moniker->log);
+
+    auto dir = rec<DirRec>();
+    run(session->makeDirReqSP(mk(m(CityHall)), dir));
+    EXPECT_EQ((QStringList{QStringLiteral("ok /Evening News/Footage/City Hall Exterior"), QStringLiteral("finished")}), dir->log);
+
+    auto linked = rec<NodeRec>();
+    run(session->makeGetLinkedProjectsReqSP(mk(m(Footage)), linked));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Sports Tonight"), QStringLiteral("finished")}), linked->log);
+
+    auto synced = rec<NodeRec>();
+    run(session->makeGetSyncedProjRootReqSP(mk(QStringLiteral("zel-mem://C-GOAL")), synced));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Sports Tonight"), QStringLiteral("finished")}), synced->log);
+    auto notSynced = rec<NodeRec>();
+    run(session->makeGetSyncedProjRootReqSP(mk(m(Mayor)), notSynced));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotFound}, notSynced->codes);
+
+    auto associations = rec<AssociationsRec>();
+    run(session->makeAssociationsReqSP(mk(m(Mayor)), associations));
+    EXPECT_EQ((QStringList{QStringLiteral("ok /media/newsroom/CARD-0417"), QStringLiteral("ok /media/newsroom/proxy"),
+                           QStringLiteral("finished")}),
+              associations->log);
+
+    boost::shared_ptr<Zel_QuerySpec> spec(new Zel_QuerySpec(QStringLiteral("mayor")));
+    auto query = rec<QueryRec>();
+    run(session->makeQueryReqSP(spec, query));
+    EXPECT_EQ(spec, query->getQuerySpec());
+    // Names and text-searchable properties ("Comments" of the soundbite does not say mayor; its name does).
+    EXPECT_EQ((QStringList{QStringLiteral("ok Interview Mayor"), QStringLiteral("ok Mayor Soundbite"), QStringLiteral("finished")}),
+              query->log);
+    boost::shared_ptr<Zel_QuerySpec> typed(new Zel_QuerySpec(QStringLiteral("order")));
+    typed->addTypeParam(QStringLiteral("sequence"));
+    auto typedQuery = rec<QueryRec>();
+    run(session->makeQueryReqSP(typed, typedQuery));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Evening News 18-00"), QStringLiteral("finished")}), typedQuery->log);
+    auto emptyQuery = rec<QueryRec>();
+    run(session->makeQueryReqSP(boost::shared_ptr<Zel_QuerySpec>(new Zel_QuerySpec), emptyQuery));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidArgument}, emptyQuery->codes);
+}
+
+TEST_F(Zel_MemorySessionTest, PropertiesPermissionsReservationsAndResolutions)
+{
+    auto list = rec<PropertiesRec>();
+    run(session->makePropertyListReqSP(mk(m(Mayor)), list));
+    EXPECT_EQ(QStringLiteral("Name"), list->last.at(0).key());
+    EXPECT_EQ(QStringLiteral("Interview Mayor"), list->last.at(0).value());
+    EXPECT_EQ(QStringLiteral("masterclip"), list->last.findByKey(QStringLiteral("Mime Type")).value());
+    EXPECT_EQ(QStringLiteral("darkred;darkgreen;darkblue"), list->last.findByKey(QStringLiteral("Color")).customValues());
+    // The session registered the tree's property manager.
+    EXPECT_EQ(QStringLiteral("Tape Name"), Zel_Property::getDisplayName(QStringLiteral("Tape")));
+    EXPECT_FALSE(Zel_Property::getIsModifiable(QStringLiteral("Duration")));
+    EXPECT_TRUE(Zel_Property::getHasCustomValues(QStringLiteral("Color")));
+    EXPECT_EQ(QStringLiteral("Comments"), Zel_Property::getKeyByDisplayName(QStringLiteral("Comments")));
+
+    auto some = rec<PropertiesRec>();
+    run(session->makeGetPropertiesReqSP(mk(m(Mayor)), QStringList{QStringLiteral("Tape"), QStringLiteral("Story_ID")}, some));
+    EXPECT_EQ((QStringList{QStringLiteral("ok 2"), QStringLiteral("finished")}), some->log);
+    EXPECT_EQ(QStringLiteral("NEWS-0302-TRAM"), some->last.findByKey(QStringLiteral("Story_ID")).value());
+    auto unknown = rec<PropertiesRec>();
+    run(session->makeGetPropertiesReqSP(mk(m(Mayor)), QStringList{QStringLiteral("Nonsense")}, unknown));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::UnknownProperty}, unknown->codes);
+
+    auto permissions = rec<PermissionsRec>();
+    run(session->makeNodePermissionsReqSP(mk(m(Archive)), permissions));
+    // The editor may only read and copy in the archive.
+    EXPECT_EQ((QStringList{QStringLiteral("ok { a o stp ral hr lr ar uam cc mc mpa R C fi fo wa wua wnv wl wd dela desa desm res "
+                                          "ovres pm cl ml cr mr } zel-mem://B-ARCHIVE"),
+                           QStringLiteral("finished")}),
+              permissions->log);
+    auto others = rec<PermissionsRec>();
+    run(session->makeGetUserPriviledgesReqSP(QStringLiteral("producer"), mk(m(Footage)), others));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::PermissionDenied}, others->codes);
+    EXPECT_TRUE(others->privilege);
+    boost::shared_ptr<Zel_MemorySession> admin = newSession(QStringLiteral("admin"));
+    auto asAdmin = rec<PermissionsRec>();
+    run(admin->makeGetUserPriviledgesReqSP(QStringLiteral("assistant"), mk(m(Archive)), asAdmin), admin);
+    ASSERT_EQ(2, asAdmin->log.size());
+    EXPECT_TRUE(asAdmin->log[0].contains(QStringLiteral(" r c "))) << asAdmin->log[0].toStdString();
+
+    auto reservations = rec<ReservationsRec>();
+    run(session->makeGetReservationsReqSP(mk(m(Bulletin)), reservations));
+    EXPECT_EQ((QStringList{QStringLiteral("ok producer -"), QStringLiteral("finished")}), reservations->log);
+
+    auto resolutions = rec<ResolutionsRec>();
+    run(session->makeMediaResolutionsReqSP(resolutions));
+    ASSERT_EQ(2, resolutions->log.size());
+    EXPECT_TRUE(resolutions->log[0].contains(QStringLiteral("Zel_PropertyKeyInfo(9001:PCM 48 kHz:PCM 48 kHz:F:T:3:F:F)")));
+    EXPECT_EQ(4, session->getResolutionIDList().size());
+
+    auto nodeResolutions = rec<NodeResolutionsRec>();
+    run(session->makeNodeResolutionsReqSP(mk(m(Mayor)), nodeResolutions));
+    EXPECT_EQ((QStringList{QStringLiteral("ok %1 DNxHD 145").arg(QLatin1String(MayorMob)),
+                           QStringLiteral("ok %1 PCM 48 kHz").arg(QLatin1String(MayorMob)),
+                           QStringLiteral("ok %1 H.264 Proxy").arg(QLatin1String(MayorMob)), QStringLiteral("finished")}),
+              nodeResolutions->log);
+    auto notMedia = rec<NodeResolutionsRec>();
+    run(session->makeNodeResolutionsReqSP(mk(m(Footage)), notMedia));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotMedia}, notMedia->codes);
+}
+
+TEST_F(Zel_MemorySessionTest, ChangesAnswerTheChangedNodesAndReachFolderListenersInOrder)
+{
+    FolderRec footage(m(Footage), session);
+    const int before = tree->nodeCount();
+
+    auto created = rec<CreateFolderRec>();
+    run(session->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Rushes"), created));
+    ASSERT_EQ(1, created->nodes.size());
+    const QString rushes = created->nodes[0]->getMoniker();
+    EXPECT_EQ(QStringLiteral("bin"), created->nodes[0]->getMimeType());
+    EXPECT_EQ(QStringLiteral("editor"), created->nodes[0]->getPropertyValue(QStringLiteral("Created By")));
+
+    auto again = rec<CreateFolderRec>();
+    run(session->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Rushes"), again));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NameExists}, again->codes);
+
+    auto unique = rec<CreateFolderUniqueRec>();
+    run(session->makeCreateFolderUniqueReqSP(mk(m(Footage)), QStringLiteral("Rushes"), unique));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Rushes 2"), QStringLiteral("finished")}), unique->log);
+
+    Zel_PropertyList props;
+    props.append(Zel_Property(QStringLiteral("Mime Type"), QStringLiteral("sequence"), QString()));
+    props.append(Zel_Property(QStringLiteral("Comments"), QStringLiteral("draft"), QString()));
+    auto node = rec<NodeRec>();
+    run(session->makeCreateNodeUniqueReqSP(mk(rushes), QStringLiteral("Cut 1"), props, node));
+    ASSERT_EQ(1, node->nodes.size());
+    EXPECT_EQ(QStringLiteral("sequence"), node->nodes[0]->getMimeType());
+    EXPECT_FALSE(node->nodes[0]->getMobID().isEmpty());
+    EXPECT_EQ(QStringLiteral("draft"), node->nodes[0]->getPropertyValue(QStringLiteral("Comments")));
+
+    auto renamed = rec<RenameNodeRec>();
+    run(session->makeRenameNodeReqSP(mk(rushes), QStringLiteral("Dailies"), renamed));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Dailies"), QStringLiteral("finished")}), renamed->log);
+    auto renamedUnique = rec<RenameUniqueRec>();
+    run(session->makeRenameUniqueReqSP(mk(unique->nodes[0]->getMoniker()), QStringLiteral("Dailies"), renamedUnique));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Dailies 2"), QStringLiteral("finished")}), renamedUnique->log);
+
+    auto moved = rec<MoveNodeRec>();
+    run(session->makeMoveNodeReqSP(mk(m(CityHall)), mk(rushes), moved));
+    EXPECT_EQ(QStringLiteral("/Evening News/Footage/Dailies/City Hall Exterior"),
+              moved->nodes.value(0) ? moved->nodes[0]->getPath().toZelString(QStringLiteral("/")) : QString());
+
+    auto copied = rec<CopyRec>();
+    run(session->makeCopyNodeReqSP(mk(rushes), mk(m(Footage)), copied));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Dailies -> Dailies 3"), QStringLiteral("finished")}), copied->log);
+    EXPECT_EQ((QList<unsigned long>{3, 3}), copied->progressCalls); // the bin, the sequence and the clip
+
+    auto deleted = rec<BoolRec>();
+    run(session->makeDeleteNodeReqSP(mk(unique->nodes[0]->getMoniker()), deleted));
+    EXPECT_EQ((QStringList{QStringLiteral("ok true"), QStringLiteral("finished")}), deleted->log);
+
+    EXPECT_EQ(before + 3 + 3 - 1, tree->nodeCount()); // three created, three copied, one deleted
+    const QString copy = copied->nodes[0]->getMoniker();
+    EXPECT_EQ((QStringList{QStringLiteral("added ") + rushes, QStringLiteral("added ") + unique->nodes[0]->getMoniker(),
+                           QStringLiteral("updated ") + rushes, QStringLiteral("updated ") + unique->nodes[0]->getMoniker(),
+                           QStringLiteral("removed ") + m(CityHall), QStringLiteral("added ") + copy,
+                           QStringLiteral("removed ") + unique->nodes[0]->getMoniker()}),
+              footage.events());
+}
+
+TEST_F(Zel_MemorySessionTest, FailuresAreDataAndLeaveTheTreeUnchanged)
+{
+    const QByteArray before = tree->toJson();
+    FolderRec footage(m(Footage), session);
+
+    auto unknown = rec<RenameNodeRec>();
+    run(session->makeRenameNodeReqSP(mk(QStringLiteral("zel-mem://NOPE")), QStringLiteral("X"), unknown));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::UnknownMoniker}, unknown->codes);
+    EXPECT_EQ(QStringLiteral("No node has the moniker \"zel-mem://NOPE\"."), unknown->messages.value(0));
+
+    auto badName = rec<RenameNodeRec>();
+    run(session->makeRenameNodeReqSP(mk(m(Mayor)), QStringLiteral("a/b"), badName));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidName}, badName->codes);
+    auto punctuation = rec<CreateFolderRec>();
+    run(session->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("--- !"), punctuation));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidName}, punctuation->codes);
+
+    auto denied = rec<BoolRec>();
+    run(session->makeDeleteNodeReqSP(mk(QStringLiteral("zel-mem://C-ELECTION")), denied));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::PermissionDenied}, denied->codes);
+    EXPECT_TRUE(denied->privilege);
+    EXPECT_TRUE(denied->messages.value(0).contains(QStringLiteral("DeleteAssets"))) << denied->messages.value(0).toStdString();
+
+    auto reserved = rec<SetPropertiesRec>();
+    Zel_PropertyList comments;
+    comments.append(Zel_Property(QStringLiteral("Comments"), QStringLiteral("mine now"), QString()));
+    run(session->makeSetPropertiesReqSP(mk(m(Bulletin)), comments, reserved));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::ReservedByOtherUser}, reserved->codes);
+    EXPECT_FALSE(reserved->privilege);
+    auto deleteReservedBin = rec<BoolRec>();
+    run(session->makeDeleteNodeReqSP(mk(m(Sequences)), deleteReservedBin));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::ReservedByOtherUser}, deleteReservedBin->codes);
+
+    auto intoItself = rec<MoveNodeRec>();
+    run(session->makeMoveNodeReqSP(mk(m(News)), mk(m(Footage)), intoItself));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidTarget}, intoItself->codes);
+    auto notFolder = rec<CreateFolderRec>();
+    run(session->makeCreateFolderReqSP(mk(m(Mayor)), QStringLiteral("Inside"), notFolder));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotAFolder}, notFolder->codes);
+    auto fixed = rec<SetPropertiesRec>();
+    Zel_PropertyList duration;
+    duration.append(Zel_Property(QStringLiteral("Duration"), QStringLiteral("1"), QString()));
+    run(session->makeSetPropertiesReqSP(mk(m(Mayor)), duration, fixed));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::PropertyNotModifiable}, fixed->codes);
+
+    // A deletion of several assets: the denied one is reported, nothing else changes.
+    auto many = rec<DeleteRec>();
+    run(session->makeDeleteReqSP(QStringList{QStringLiteral("zel-mem://C-ELECTION"), QStringLiteral("zel-mem://NOPE")}, true, true, many));
+    EXPECT_EQ((QStringList{QStringLiteral("fail 1003"), QStringLiteral("fail 1001"), QStringLiteral("assets 0"),
+                           QStringLiteral("records 0"), QStringLiteral("finished")}),
+              many->log);
+
+    auto failedCheckin = rec<CheckinRec>();
+    run(session->makeCheckinReqSP(Zel_MobDescList(), mk(m(Archive)), failedCheckin));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::PermissionDenied}, failedCheckin->codes);
+
+    EXPECT_EQ(before, tree->toJson());
+    EXPECT_TRUE(footage.events().isEmpty()) << footage.events().join(QLatin1Char(',')).toStdString();
+}
+
+TEST_F(Zel_MemorySessionTest, ReservationsLocatorsDependenciesAndConditionalSets)
+{
+    auto reserve = rec<CreateReservationRec>();
+    run(session->makeCreateReservationReqSP(mk(m(Mayor)), QDateTime::currentDateTimeUtc().addSecs(3600), reserve));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), reserve->log);
+    boost::shared_ptr<Zel_MemorySession> producer = newSession(QStringLiteral("producer"));
+    auto blocked = rec<RenameNodeRec>();
+    run(producer->makeRenameNodeReqSP(mk(m(Mayor)), QStringLiteral("Mayor"), blocked), producer);
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::ReservedByOtherUser}, blocked->codes);
+    auto past = rec<CreateReservationRec>();
+    run(session->makeCreateReservationReqSP(mk(m(CityHall)), QDateTime::currentDateTimeUtc().addSecs(-10), past));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidArgument}, past->codes);
+    auto release = rec<RemoveReservationRec>();
+    run(session->makeRemoveReservationReqSP(mk(m(Mayor)), release));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), release->log);
+    auto releaseAgain = rec<RemoveReservationRec>();
+    run(session->makeRemoveReservationReqSP(mk(m(Mayor)), releaseAgain));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotReserved}, releaseAgain->codes);
+    auto notMine = rec<RemoveReservationRec>();
+    run(session->makeRemoveReservationReqSP(mk(m(Bulletin)), notMine));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::ReservedByOtherUser}, notMine->codes);
+
+    auto locators = rec<LocatorsRec>();
+    run(session->makeGetFrameLocatorListReqSP(mk(m(Mayor)), locators));
+    EXPECT_EQ((QStringList{QStringLiteral("ok L-1,L-2"), QStringLiteral("finished")}), locators->log);
+    EXPECT_EQ(QStringLiteral("Mayor enters"), locators->last.value(0).getValue(QStringLiteral("Comment")));
+    Zel_FrameLocator locator;
+    locator.setValue(QStringLiteral("Frame"), QStringLiteral("500"));
+    auto added = rec<LocatorsRec>();
+    run(session->makeAddFrameLocatorListReqSP(mk(m(Mayor)), QList<Zel_FrameLocator>{locator}, added));
+    EXPECT_EQ((QStringList{QStringLiteral("ok L-1,L-2,L-3"), QStringLiteral("finished")}), added->log);
+    Zel_FrameLocator first;
+    first.setID(QStringLiteral("L-1"));
+    Zel_FrameLocator missing;
+    missing.setID(QStringLiteral("L-9"));
+    auto removedNone = rec<LocatorsRec>();
+    run(session->makeDeleteFrameLocatorListReqSP(mk(m(Mayor)), QList<Zel_FrameLocator>{first, missing}, removedNone));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotFound}, removedNone->codes);
+    auto removed = rec<LocatorsRec>();
+    run(session->makeDeleteFrameLocatorListReqSP(mk(m(Mayor)), QList<Zel_FrameLocator>{first}, removed));
+    EXPECT_EQ((QStringList{QStringLiteral("ok L-2,L-3"), QStringLiteral("finished")}), removed->log);
+
+    auto restrictions = rec<RestrictionsRec>();
+    run(session->makeGetFrameRestrictionListReqSP(mk(m(CityHall)), restrictions));
+    EXPECT_EQ((QStringList{QStringLiteral("ok R-1"), QStringLiteral("finished")}), restrictions->log);
+    auto addRestriction = rec<RestrictionsRec>();
+    run(session->makeAddFrameRestrictionListReqSP(mk(m(CityHall)), QList<Zel_FrameLocator>{locator}, addRestriction));
+    EXPECT_EQ((QStringList{QStringLiteral("ok R-1,R-2"), QStringLiteral("finished")}), addRestriction->log);
+    Zel_FrameLocator r1;
+    r1.setID(QStringLiteral("R-1"));
+    auto deleteRestriction = rec<RestrictionsRec>();
+    run(session->makeDeleteFrameRestrictionListReqSP(mk(m(CityHall)), QList<Zel_FrameLocator>{r1}, deleteRestriction));
+    EXPECT_EQ((QStringList{QStringLiteral("ok R-2"), QStringLiteral("finished")}), deleteRestriction->log);
+
+    Zel_DependencySPList dependencies;
+    dependencies.append(boost::shared_ptr<Zel_Dependency>(
+        new Zel_Dependency(mk(m(CityHall)), QStringLiteral("video"), static_cast<Zel_Dependency::Zel_DependencyType>(1))));
+    auto dependency = rec<DependencyRec>();
+    run(session->makeAddDependencyReqSP(mk(QStringLiteral("zel-mem://Q-TEASER")), dependencies, dependency));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Teaser"), QStringLiteral("finished")}), dependency->log);
+    EXPECT_EQ(1, dependency->dependencies);
+
+    auto create = rec<CreatePropertyRec>();
+    run(session->makeCreatePropertyReqSP(mk(m(Mayor)), Zel_Property(QStringLiteral("Rights"), QStringLiteral("cleared"), QString()), create));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Zel_PropertyKeyInfo(Rights:Rights:rights:T:T:1:T:F)"), QStringLiteral("finished")}),
+              create->log);
+    EXPECT_EQ(QStringLiteral("Rights"), Zel_Property::getDisplayName(QStringLiteral("Rights")));
+    auto twice = rec<CreatePropertyRec>();
+    run(session->makeCreatePropertyReqSP(mk(m(Mayor)), Zel_Property(QStringLiteral("Rights"), QString(), QString()), twice));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::PropertyExists}, twice->codes);
+
+    // Conditional set: the custom values text holds the expected current value.
+    Zel_PropertyList stale;
+    stale.append(Zel_Property(QStringLiteral("Tape"), QStringLiteral("CARD-9"), QStringLiteral("CARD-1")));
+    auto conditional = rec<ConditionalRec>();
+    run(session->makeSetPropertiesReqSP(mk(m(Mayor)), stale, conditional));
+    EXPECT_EQ((QStringList{QStringLiteral("conditionFailed"), QStringLiteral("finished")}), conditional->log);
+    EXPECT_EQ(QStringLiteral("CARD-0417"), conditional->current.findByKey(QStringLiteral("Tape")).value());
+    Zel_PropertyList current;
+    current.append(Zel_Property(QStringLiteral("Tape"), QStringLiteral("CARD-9"), QStringLiteral("CARD-0417")));
+    auto applied = rec<ConditionalRec>();
+    run(session->makeSetPropertiesReqSP(mk(m(Mayor)), current, applied));
+    ASSERT_EQ(1, applied->nodes.size());
+    EXPECT_EQ(QStringLiteral("CARD-9"), applied->nodes[0]->getPropertyValue(QStringLiteral("Tape")));
+
+    // A node read before the change shows the new value once decached.
+    auto old = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(CityHall)), old));
+    Zel_PropertyList tape;
+    tape.append(Zel_Property(QStringLiteral("Tape"), QStringLiteral("NEW"), QString()));
+    auto set = rec<SetPropertiesRec>();
+    run(session->makeSetPropertiesReqSP(mk(m(CityHall)), tape, set));
+    EXPECT_EQ(QStringLiteral("CARD-0418"), old->nodes[0]->getPropertyValue(QStringLiteral("Tape")));
+    old->nodes[0]->decacheProperties();
+    EXPECT_EQ(QStringLiteral("NEW"), old->nodes[0]->getPropertyValue(QStringLiteral("Tape")));
+}
+
+TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
+{
+    FolderRec footage(m(Footage), session);
+    auto analyze = rec<AnalyzeRec>();
+    run(session->makeAnalyzeReqSP(QStringList{QStringLiteral("/ingest/storm.mxf"), QStringLiteral("/ingest/notes.txt")}, analyze));
+    ASSERT_EQ(1, analyze->descs.size());
+    EXPECT_EQ((QList<int>{Zel_MemoryErrorCodes::InvalidMedia}), analyze->codes);
+    EXPECT_EQ(QStringLiteral("/ingest/storm.mxf"), analyze->descs[0]->getAAFFilePath());
+
+    Zel_MobDescList mobs;
+    mobs.add(analyze->descs[0]);
+    mobs.add(Zel_MobDesc(QLatin1String(MayorMob), QStringLiteral("/x/again.mxf"), QString()));
+    auto checkin = rec<CheckinRec>();
+    run(session->makeCheckinReqSP(mobs, mk(m(Footage)), checkin));
+    EXPECT_EQ((QStringList{QStringLiteral("ok checked in as \"storm\""), QStringLiteral("fail 1019"), QStringLiteral("finished")}),
+              checkin->log);
+    ASSERT_EQ(1, checkin->nodes.size());
+    const QString storm = checkin->nodes[0]->getMoniker();
+
+    auto bin = rec<CheckinRec>();
+    run(session->makeCheckinLocalBinReqSP(QStringLiteral("/local/Storm Coverage.avb"), mk(m(News)), bin));
+    EXPECT_EQ((QStringList{QStringLiteral("ok checked in bin \"Storm Coverage\""), QStringLiteral("finished")}), bin->log);
+
+    Zel_MobDescList updates;
+    updates.add(Zel_MobDesc(analyze->descs[0]->getMobID(), QStringLiteral("/ingest/storm_v2.mxf"), QString()));
+    updates.add(Zel_MobDesc(QStringLiteral("no-such-mob"), QStringLiteral("/x.mxf"), QString()));
+    auto update = rec<CheckinUpdateRec>();
+    run(session->makeCheckinUpdateReqSP(updates, update));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("fail 1016"), QStringLiteral("finished")}), update->log);
+
+    boost::shared_ptr<Zel_MobID> mayorMob(new Zel_MobID(QLatin1String(MayorMob)));
+    auto mobNode = rec<MobNodeRec>();
+    run(session->makeMobNodeReqSP(mayorMob, mobNode));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Interview Mayor"), QStringLiteral("finished")}), mobNode->log);
+    auto binary = rec<MobBinaryRec>();
+    run(session->makeMobBinaryReqSP(mayorMob, binary));
+    EXPECT_TRUE(binary->last.contains("\"name\":\"Interview Mayor\"")) << binary->last.constData();
+    Zel_MobIDList dnd;
+    dnd.add(Zel_MobID(QLatin1String(MayorMob)));
+    dnd.add(Zel_MobID(QStringLiteral("missing")));
+    auto dragged = rec<MobBinaryDnDRec>();
+    run(session->makeMobBinaryDnDReqSP(dnd, dragged));
+    EXPECT_EQ((QStringList{QStringLiteral("ok ") + QLatin1String(MayorMob), QStringLiteral("fail 1016"), QStringLiteral("finished")}),
+              dragged->log);
+    auto head = rec<HeadframeRec>();
+    run(session->makeMobHeadframeReqSP(mayorMob, head));
+    EXPECT_TRUE(head->last.startsWith("P6\n16 9\n255\n"));
+    EXPECT_EQ(static_cast<char>(0x80), head->last.at(12)); // darkred: 0x800000
+
+    // Delete with media: the editor may not destroy media, so the server keeps the files.
+    auto deletion = rec<DeleteRec>();
+    run(session->makeDeleteReqSP(QStringList{storm, m(Mayor)}, true, true, deletion));
+    EXPECT_EQ((QStringList{QStringLiteral("remote media error ") + analyze->descs[0]->getMobID(),
+                           QStringLiteral("local media ") + analyze->descs[0]->getMobID(),
+                           QStringLiteral("remote media error ") + QLatin1String(MayorMob),
+                           QStringLiteral("remote media error ") + QLatin1String(MayorMob),
+                           QStringLiteral("remote media error ") + QLatin1String(MayorMob),
+                           QStringLiteral("local media ") + QLatin1String(MayorMob), QStringLiteral("assets 2"),
+                           QStringLiteral("records 2"), QStringLiteral("finished")}),
+              deletion->log);
+    EXPECT_EQ((QList<int>{1003, 1003, 1003, 1003}), deletion->codes);
+    boost::shared_ptr<Zel_MemorySession> admin = newSession(QStringLiteral("admin"));
+    auto adminDeletion = rec<DeleteRec>();
+    run(admin->makeDeleteReqSP(QStringList{m(CityHall), QStringLiteral("zel-mem://C-CROWD")}, true, false, adminDeletion), admin);
+    EXPECT_EQ((QStringList{QStringLiteral("remote media 060a2b340101010101010f00.13000000.0002"),
+                           QStringLiteral("remote media 060a2b340101010101010f00.13000000.0004"), QStringLiteral("assets 2"),
+                           QStringLiteral("records 2"), QStringLiteral("finished")}),
+              adminDeletion->log);
+
+    EXPECT_EQ((QStringList{QStringLiteral("added ") + storm, QStringLiteral("updated ") + storm, QStringLiteral("removed ") + storm,
+                           QStringLiteral("removed ") + m(Mayor), QStringLiteral("removed ") + m(CityHall),
+                           QStringLiteral("removed zel-mem://C-CROWD")}),
+              footage.events());
+}
+
+TEST_F(Zel_MemorySessionTest, SettingsRoundTripAsXml)
+{
+    auto startup = rec<StartupRec>();
+    run(session->makeStartupReqSP(startup));
+    EXPECT_EQ(QStringList{QStringLiteral("ok ")}, startup->log);
+
+    auto app = rec<AppSettingsRec>();
+    run(session->makeGetApplicationSettingsReqSP(QStringLiteral("zel-demo"), app));
+    ASSERT_EQ(2, app->log.size());
+    EXPECT_TRUE(app->log[0].contains(QStringLiteral("<Language>en</Language>"))) << app->log[0].toStdString();
+
+    Zel_SettingList settings;
+    settings.addIfKeyNotInList(Zel_Setting(QStringLiteral("View.Zoom"), QStringLiteral("150")));
+    settings.addIfKeyNotInList(Zel_Setting(QStringLiteral("View.Grid"), QStringLiteral("on")));
+    auto setApp = rec<SetApplicationSettingsRec>();
+    run(session->makeSetApplicationSettingsReqSP(QStringLiteral("zel-demo"), settings.toXML(QStringLiteral("Settings")), setApp));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), setApp->log);
+    auto appAgain = rec<AppSettingsRec>();
+    run(session->makeGetApplicationSettingsReqSP(QStringLiteral("zel-demo"), appAgain));
+    EXPECT_TRUE(appAgain->log[0].contains(QStringLiteral("<Zoom>150</Zoom>")));
+    EXPECT_FALSE(appAgain->log[0].contains(QStringLiteral("Language")));
+    auto malformed = rec<SetApplicationSettingsRec>();
+    run(session->makeSetApplicationSettingsReqSP(QStringLiteral("zel-demo"), QStringLiteral("<Settings><a></Settings>"), malformed));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidArgument}, malformed->codes);
+    EXPECT_TRUE(malformed->messages.value(0).contains(QStringLiteral("line 1"))) << malformed->messages.value(0).toStdString();
+
+    auto user = rec<UserSettingsRec>();
+    run(session->makeGetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsGeneral, user));
+    EXPECT_TRUE(user->log.value(0).startsWith(QStringLiteral("ok 0 "))) << user->log.value(0).toStdString();
+    EXPECT_TRUE(user->log.value(0).contains(QStringLiteral("<TrackHeight>48</TrackHeight>")));
+    auto setUser = rec<SetUserSettingsRec>();
+    run(session->makeSetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsSite, settings.toXML(QStringLiteral("S")), setUser));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), setUser->log);
+    auto site = rec<UserSettingsRec>();
+    run(session->makeGetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsSite, site));
+    EXPECT_TRUE(site->log.value(0).contains(QStringLiteral("<Grid>on</Grid>")));
+    auto badType = rec<UserSettingsRec>();
+    run(session->makeGetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsUnknown, badType));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidArgument}, badType->codes);
+
+    auto workgroup = rec<SettingsRec>();
+    run(session->makeGetWorkgroupSettingsReqSP(workgroup));
+    EXPECT_TRUE(workgroup->log.value(0).contains(QStringLiteral("<Name>Newsroom</Name>")));
+    EXPECT_EQ(QStringLiteral("Newsroom"), session->getWorkgroupName());
+
+    auto document = rec<GetSettingsRec>();
+    run(session->makeGetSettingsReqSP(QStringLiteral("Playout"), document));
+    EXPECT_TRUE(document->log.value(0).contains(QStringLiteral("<Server>playout-1</Server>")));
+    auto save = rec<SaveSettingsRec>();
+    run(session->makeSaveSettingsReqSP(QStringLiteral("Ingest"), QStringLiteral("<Ingest><Path>/in</Path></Ingest>"), save));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), save->log);
+    auto saved = rec<GetSettingsRec>();
+    run(session->makeGetSettingsReqSP(QStringLiteral("Ingest"), saved));
+    EXPECT_EQ((QStringList{QStringLiteral("ok <Ingest><Path>/in</Path></Ingest>"), QStringLiteral("finished")}), saved->log);
+    auto none = rec<GetSettingsRec>();
+    run(session->makeGetSettingsReqSP(QStringLiteral("Nothing"), none));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotFound}, none->codes);
+}
+
+TEST_F(Zel_MemorySessionTest, ConnectionLossIsAnnouncedAndFailsRequestsUntilReconnected)
+{
+    boost::shared_ptr<StatusRec> status(new StatusRec);
+    session->setStatusNotificationCB(status);
+    EXPECT_EQ(status, session->getStatusNotificationCBSP());
+    session->simulateConnectionLoss();
+    session->simulateConnectionLoss(); // already down: no second notice
+    EXPECT_FALSE(session->getConnectionStatus());
+    auto during = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Mayor)), during));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotConnected}, during->codes);
+    session->simulateReconnect();
+    EXPECT_TRUE(session->getConnectionStatus());
+    auto after = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Mayor)), after));
+    EXPECT_EQ(1, after->ok);
+    EXPECT_EQ((QStringList{QStringLiteral("disconnected"), QStringLiteral("connected")}), status->log);
+}
+
+TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
+{
+    EXPECT_EQ(QStringLiteral("Newsroom Asset Server (in memory)"), session->getServerName());
+    EXPECT_EQ(QStringLiteral("zel-memory 1.0"), session->getServerVersion());
+    EXPECT_EQ(QStringLiteral("zel-demo"), session->getApplicationName());
+    EXPECT_EQ(m(Root), *session->getRootMonikerSP());
+    EXPECT_EQ(m(Root), *session->getHomeMonikerSP());
+    EXPECT_EQ(QStringLiteral("/"), session->getPathSeparator());
+    EXPECT_TRUE(session->isValidMoniker(m(Mayor)));
+    EXPECT_FALSE(session->isValidMoniker(QStringLiteral("http://x")));
+    EXPECT_EQ(engine.getResultQ(), session->getResultQSP());
+    EXPECT_TRUE(session->supportsRequest(QStringLiteral("Zel_GetNodeReq")));
+    EXPECT_TRUE(session->supportsRequest(QStringLiteral("Zel_Query")));
+    EXPECT_FALSE(session->supportsRequest(QStringLiteral("Zel_FlyReq")));
+    EXPECT_TRUE(session->getServerTime().isValid());
+    EXPECT_FALSE(session->isReadOnly());
+    EXPECT_TRUE(newSession(QStringLiteral("assistant"))->isReadOnly());
+    EXPECT_EQ(128, session->getMaxNameLength());
+    EXPECT_FALSE(session->isValidAssetName(QStringLiteral("a:b")));
+    EXPECT_TRUE(session->isValidAssetName(QStringLiteral("Rushes 2")));
+
+    // A request made but not yet run is cancelled with the rest.
+    auto cancelled = rec<NodeRec>();
+    boost::shared_ptr<Zel_GetNodeReq> pending = session->makeGetNodeReqSP(mk(m(Mayor)), cancelled);
+    session->cancelAllRequests();
+    run(pending);
+    EXPECT_TRUE(cancelled->log.isEmpty());
+
+    session->close();
+    EXPECT_FALSE(session->isLoggedIn());
+    EXPECT_FALSE(session->makeGetNodeReqSP(mk(m(Mayor)), rec<NodeRec>()));
+    EXPECT_FALSE(session->submitRequest(boost::shared_ptr<Orv_Request>()));
+}
