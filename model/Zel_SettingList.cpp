@@ -34,7 +34,8 @@ struct ChildKeyHash
 {
     std::size_t operator()(const ChildKey& key) const
     {
-        return static_cast<std::size_t>(qHash(key.name)) ^ (key.parent * static_cast<std::size_t>(0x9E3779B97F4A7C15ull));
+        const std::size_t spread = key.parent * static_cast<std::size_t>(0x9E3779B97F4A7C15ull);
+        return static_cast<std::size_t>(qHash(key.name)) ^ spread;
     }
 };
 
@@ -154,6 +155,7 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
         return QString();
     }
 
+    const boost::shared_ptr<Zel_Debug> trace = Zel_Debug::instance();
     QDomDocument document;
     QDomElement root = document.createElement(rootName);
     document.appendChild(root);
@@ -164,8 +166,10 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
         bool invalid = false;
         QDomElement leaf = tree.addPath(key, &invalid);
         if (invalid) {
-            Zel_Debug::instance()->debug(QLatin1String(kTraceSource),
-                QStringLiteral("key \"%1\" does not give valid XML element names; setting left out").arg(key), 0);
+            if (trace->getEnabled()) {
+                trace->debug(QLatin1String(kTraceSource),
+                    QStringLiteral("key \"%1\" does not give valid XML element names; setting left out").arg(key), 0);
+            }
             continue;
         }
         if (!leaf.isNull())
@@ -174,7 +178,8 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
 
     const QDateTime moment = modifyDate.isValid() ? modifyDate : QDateTime::currentDateTime();
     root.setAttribute(QStringLiteral("version"), QStringLiteral("1.0"));
-    root.setAttribute(QStringLiteral("modifydate"), ZelXml::xmlCharsOnly(moment.toLocalTime().toString(Qt::TextDate)));
+    root.setAttribute(QStringLiteral("modifydate"),
+                      ZelXml::xmlCharsOnly(moment.toLocalTime().toString(Qt::TextDate)));
     root.setAttribute(QStringLiteral("modifydateInt"), QString::number(ZelCompat::toTimeT(moment)));
 
     return document.toString(1);
