@@ -1,0 +1,192 @@
+// zel-demo: a guided tour of the zel client library.
+//
+// The demo is an application in miniature. It builds the in-memory backend's
+// session over an asset tree (the bundled sample, or a tree file), runs every
+// request on the worker threads of an Orv_Engine, delivers the answers on the
+// main thread, and prints what its callbacks and listeners receive. Each step
+// checks its answers; the exit status says whether all of them were right.
+#include "Console.h"
+#include "Tour.h"
+
+#include "Zel_MemorySession.h"
+#include "Zel_MemoryTree.h"
+
+#include "Orv.h"
+#include "Orv_Engine.h"
+#include "Zel_Debug.h"
+
+#include <QString>
+#include <QStringList>
+#include <QtGlobal>
+#include <boost/make_shared.hpp>
+
+#include <cstdio>
+
+namespace {
+
+const char* const kUsage =
+    "Usage: zel-demo [--tree FILE] [--user NAME] [--password TEXT] [--trace]\n"
+    "       zel-demo --write-sample FILE\n"
+    "\n"
+    "A guided tour of zel, the client interface through which a media-editing\n"
+    "application works with a media asset-management server. The server here is\n"
+    "the in-memory backend (Zel::memory), running in this process.\n"
+    "\n"
+    "The demo acts as an application would: it logs in, browses the asset tree,\n"
+    "reads properties, watches a bin while it creates, renames and deletes bins\n"
+    "and clips, checks media in, reserves and releases a clip, deletes assets with\n"
+    "their media, reads and writes settings, searches, shows permissions, and\n"
+    "rides out a lost connection. It prints every answer its callbacks receive and\n"
+    "checks each step's answers.\n"
+    "\n"
+    "Options:\n"
+    "  --tree FILE          tour the asset tree in FILE (JSON, the form\n"
+    "                       Zel_MemoryTree saves) instead of the bundled sample\n"
+    "  --user NAME          log in as NAME (default: editor)\n"
+    "  --password TEXT      log in with TEXT (default: the user name, as in the sample)\n"
+    "  --trace              turn the library's trace log on and print its lines\n"
+    "  --write-sample FILE  write the bundled sample tree to FILE, to edit and tour\n"
+    "  -h, --help           show this help\n"
+    "\n"
+    "Exit status: 0 when every step got the answers it expected; 1 when one did not\n"
+    "(the step and what it expected are printed); 2 for a bad command line or a\n"
+    "tree file that cannot be read.\n";
+
+struct Options {
+    QString treeFile;
+    QString writeSample;
+    QString user = QStringLiteral("editor");
+    QString password;
+    bool passwordGiven = false;
+    bool trace = false;
+    bool help = false;
+};
+
+int usageError(const QString& message)
+{
+    std::fprintf(stderr, "zel-demo: %s\nTry 'zel-demo --help'.\n", message.toLocal8Bit().constData());
+    return 2;
+}
+
+// Parses the command line into options; an empty error text means success.
+QString parse(int argc, char** argv, Options& options)
+{
+    for (int i = 1; i < argc; ++i) {
+        const QString arg = QString::fromLocal8Bit(argv[i]);
+        auto value = [&](QString& into) {
+            if (i + 1 >= argc)
+                return false;
+            into = QString::fromLocal8Bit(argv[++i]);
+            return true;
+        };
+        if (arg == QLatin1String("-h") || arg == QLatin1String("--help")) {
+            options.help = true;
+        } else if (arg == QLatin1String("--trace")) {
+            options.trace = true;
+        } else if (arg == QLatin1String("--tree")) {
+            if (!value(options.treeFile) || options.treeFile.isEmpty())
+                return QStringLiteral("--tree needs a file name");
+        } else if (arg == QLatin1String("--write-sample")) {
+            if (!value(options.writeSample) || options.writeSample.isEmpty())
+                return QStringLiteral("--write-sample needs a file name");
+        } else if (arg == QLatin1String("--user")) {
+            if (!value(options.user) || options.user.isEmpty())
+                return QStringLiteral("--user needs a name");
+        } else if (arg == QLatin1String("--password")) {
+            if (!value(options.password))
+                return QStringLiteral("--password needs a text");
+            options.passwordGiven = true;
+        } else {
+            return QStringLiteral("unknown argument '%1'").arg(arg);
+        }
+    }
+    if (!options.passwordGiven)
+        options.password = options.user;
+    return QString();
+}
+
+// With --trace, the trace lines reach the demo twice: through Orv::log (which
+// the demo prints in the flow of the tour) and as Qt debug messages. The
+// latter are dropped; Qt's warnings still go to stderr.
+void qtMessages(QtMsgType type, const QMessageLogContext&, const QString& message)
+{
+    if (type == QtDebugMsg || type == QtInfoMsg)
+        return;
+    Console::instance().qtMessage(message);
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    Options options;
+    const QString error = parse(argc, argv, options);
+    if (!error.isEmpty())
+        return usageError(error);
+    if (options.help) {
+        std::fputs(kUsage, stdout);
+        return 0;
+    }
+    if (!options.writeSample.isEmpty()) {
+        QString why;
+        if (!Zel_MemoryTree::sample()->saveFile(options.writeSample, &why)) {
+            std::fprintf(stderr, "zel-demo: %s\n", why.toLocal8Bit().constData());
+            return 2;
+        }
+        std::printf("zel-demo: wrote the sample tree to %s\n", options.writeSample.toLocal8Bit().constData());
+        return 0;
+    }
+
+    boost::shared_ptr<Zel_MemoryTree> tree;
+    if (options.treeFile.isEmpty()) {
+        tree = Zel_MemoryTree::sample();
+    } else {
+        QString why;
+        tree = Zel_MemoryTree::fromFile(options.treeFile, &why);
+        if (!tree) {
+            std::fprintf(stderr, "zel-demo: cannot load the tree: %s\n", why.toLocal8Bit().constData());
+            return 2;
+        }
+    }
+
+    QtMessageHandler previousHandler = nullptr;
+    if (options.trace) {
+        previousHandler = qInstallMessageHandler(qtMessages);
+        Orv::setLogHandler([](const char* line) { Console::instance().trace(line); });
+        Zel_Debug::instance()->setEnabled(true);
+    }
+
+    Console& out = Console::instance();
+    out.line(QStringLiteral("zel-demo: a tour of zel, the client interface to a media asset-management server"));
+    out.line(QStringLiteral("Server:   %1, the in-memory backend, with %2 (%3 nodes)")
+                 .arg(quoted(tree->serverName()),
+                      options.treeFile.isEmpty() ? QStringLiteral("the bundled sample tree") : QStringLiteral("the tree of ") + options.treeFile,
+                      QString::number(tree->nodeCount())));
+
+    int status = 0;
+    {
+        // Requests run on the engine's two worker threads; their answers are
+        // delivered on this thread whenever the tour calls DeliverAll.
+        Orv_Engine engine(2);
+        out.line(QStringLiteral("Engine:   requests run on %1 worker threads of an Orv_Engine; answers are delivered on"
+                                "\n          this thread (Orv_Engine::DeliverAll) to the application's callbacks.")
+                     .arg(engine.workerCount()));
+        out.line(QStringLiteral("Legend:   -> a request sent   <- an answer received   ~~ a notification heard"
+                                "\n          !! an answer the tour did not expect"));
+        boost::shared_ptr<Zel_MemorySession> session =
+            boost::make_shared<Zel_MemorySession>(tree, &engine, QStringLiteral("zel-demo"));
+        {
+            Tour tour(engine, session, options.user, options.password);
+            status = tour.run();
+        }
+        session.reset();
+        engine.DeliverAll();
+    }
+
+    if (options.trace) {
+        Zel_Debug::instance()->setEnabled(false);
+        Orv::setLogHandler(Orv::LogHandler());
+        qInstallMessageHandler(previousHandler);
+    }
+    return status;
+}
