@@ -130,12 +130,19 @@ QString errorCodeName(int code)
     return QStringLiteral("code");
 }
 
+QString errorHeadline(const boost::shared_ptr<Zel_Error>& error)
+{
+    if (!error || !error->isError())
+        return QStringLiteral("no error");
+    QString text = errorCodeName(error->getCode()) + QLatin1Char(' ') + QString::number(error->getCode());
+    if (error->isPrivilegeError())
+        text += QStringLiteral(" (privilege error)");
+    return text;
+}
+
 QString describeError(const boost::shared_ptr<Zel_Error>& error)
 {
     if (!error || !error->isError())
         return QStringLiteral("no error");
-    QString text = QStringLiteral("%1 %2: %3").arg(errorCodeName(error->getCode())).arg(error->getCode()).arg(error->getMsg());
-    if (error->isPrivilegeError())
-        text += QStringLiteral(" (privilege error)");
-    return text;
+    return errorHeadline(error) + QStringLiteral(": ") + error->getMsg();
 }

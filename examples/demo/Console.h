@@ -63,6 +63,8 @@ QString describeNode(const boost::shared_ptr<Zel_Node>& node);
 // "PermissionDenied 1003: <message> (privilege error)"; "no error" for a
 // record that reports none.
 QString describeError(const boost::shared_ptr<Zel_Error>& error);
+// The same without the message: "PermissionDenied 1003 (privilege error)".
+QString errorHeadline(const boost::shared_ptr<Zel_Error>& error);
 // The name of a code of Zel_MemoryErrorCodes ("PermissionDenied"), or the number.
 QString errorCodeName(int code);
 // The text in double quotes.

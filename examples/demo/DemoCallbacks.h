@@ -55,7 +55,9 @@ protected:
     void gotFailure(const boost::shared_ptr<Zel_Error>& error)
     {
         failures.push_back(error);
-        Console::instance().answer(QStringLiteral("failed: ") + describeError(error));
+        Console::instance().answer(QStringLiteral("failed: ") + errorHeadline(error));
+        if (error)
+            Console::instance().detail(error->getMsg());
     }
     void gotFinished()
     {
@@ -254,16 +256,17 @@ public:
                    boost::shared_ptr<QString> text) override
     {
         checkedIn.push_back(CheckedIn{mobDesc, node});
-        Console::instance().answer(QStringLiteral("succeeded: %1 -> %2 %3 (%4)")
-                                       .arg(mobDesc ? mobDesc->getAAFFilePath() : QString(), describeNode(node),
-                                            node ? node->getMoniker() : QString(), text ? *text : QString()));
+        Console::instance().answer(QStringLiteral("succeeded: %1 %2").arg(describeNode(node), node ? node->getMoniker() : QString()));
+        Console::instance().detail(QStringLiteral("from %1: %2").arg(mobDesc ? mobDesc->getAAFFilePath() : QString(),
+                                                                     text ? *text : QString()));
     }
     void failed(boost::shared_ptr<Zel_MobDesc> mobDesc, boost::shared_ptr<Zel_Error> error) override
     {
         refused.push_back(mobDesc);
         failures.push_back(error);
-        Console::instance().answer(QStringLiteral("failed: %1: %2")
-                                       .arg(mobDesc ? mobDesc->getAAFFilePath() : QString(), describeError(error)));
+        Console::instance().answer(QStringLiteral("failed: %1 for %2").arg(errorHeadline(error), mobDesc ? mobDesc->getAAFFilePath() : QString()));
+        if (error)
+            Console::instance().detail(error->getMsg());
     }
     void finished() override { gotFinished(); }
 };
@@ -336,8 +339,8 @@ public:
     }
     void remoteMetadataDeleteErrorPartialResult(boost::shared_ptr<Zel_MobID> mobID, boost::shared_ptr<Zel_Error> error) override
     {
-        add(MetadataError, 0, mob(mobID), error,
-            QStringLiteral("metadata of %1 not deleted: %2").arg(mob(mobID), describeError(error)));
+        add(MetadataError, 0, mob(mobID), error, QStringLiteral("metadata of %1 not deleted").arg(mob(mobID)));
+        Console::instance().detail(describeError(error));
     }
     void remoteMediaDeleteSuccessPartialResult(boost::shared_ptr<Zel_MobID> mobID) override
     {
@@ -367,13 +370,15 @@ public:
     }
     void localDeleteMobNotFoundErrorPartialResult(boost::shared_ptr<Zel_MobID> mobID, boost::shared_ptr<Zel_Error> error) override
     {
-        add(LocalMobNotFound, 0, mob(mobID), error,
-            QStringLiteral("no media of %1 on this machine: %2").arg(mob(mobID), describeError(error)));
+        add(LocalMobNotFound, 0, mob(mobID), error, QStringLiteral("no media of %1 on this machine").arg(mob(mobID)));
+        Console::instance().detail(describeError(error));
     }
     void errorResult(boost::shared_ptr<Zel_Error> error) override
     {
         failures.push_back(error);
-        add(WholeError, 0, QString(), error, QStringLiteral("error: ") + describeError(error));
+        add(WholeError, 0, QString(), error, QStringLiteral("error: ") + errorHeadline(error));
+        if (error)
+            Console::instance().detail(error->getMsg());
     }
     void finished() override { gotFinished(); }
 

@@ -312,6 +312,8 @@ bool Tour::logIn()
                         quoted(mSession->getUserName()),
                         quoted(mSession->getApplicationName()),
                         mSession->isReadOnly() ? QStringLiteral(", read-only") : QString()));
+    if (mSession->isReadOnly())
+        out().note(QStringLiteral("%1 may only read: the steps that change the tree will be refused.").arg(quoted(mUser)));
     return true;
 }
 
@@ -483,7 +485,7 @@ bool Tour::watchBin()
         auto clip = boost::make_shared<NodeAnswers<Zel_ResultCB>>();
         send(mSession->makeCreateNodeUniqueReqSP(binMoniker, QStringLiteral("Street Interview"), properties, clip),
              QStringLiteral("Zel_CreateNodeUniqueReq \"Street Interview\" (a master clip)%1")
-                 .arg(i == 2 ? QStringLiteral(" again: the server makes the name unique") : QString()));
+                 .arg(i == 2 ? QStringLiteral(" again: made unique") : QString()));
         if (!expect(clip->failures.empty() && clip->nodes.size() == 1 && clip->nodes[0]->isMedia(),
                     QStringLiteral("a new master clip")))
             return false;
@@ -528,6 +530,8 @@ bool Tour::checkIn()
     const QString knownMob = mShowcase ? mShowcase->getMobID().toZelString() : QString();
     if (!knownMob.isEmpty())
         mobs.add(Zel_MobDesc(knownMob, QStringLiteral("/media/demo/mayor_again.mxf"), QString()));
+    else
+        out().note(QStringLiteral("(The tree has no media object to offer again: nothing to be refused.)"));
 
     const std::size_t eventsBefore = mBinWatch->heard.size();
     auto checkin = boost::make_shared<CheckinAnswers>();
@@ -623,7 +627,8 @@ bool Tour::deleteAssets()
     const std::size_t eventsBefore = mBinWatch->heard.size();
     auto deleted = boost::make_shared<DeleteAnswers>();
     send(mSession->makeDeleteReqSP(monikers, true, true, deleted),
-         QStringLiteral("Zel_DeleteReq for %1, with their media on the server and here").arg(names.join(QStringLiteral(", "))));
+         QStringLiteral("Zel_DeleteReq for %1 assets, with their media on the server and here:\n        %2")
+             .arg(QString::number(names.size()), names.join(QStringLiteral(", "))));
 
     expect(deleted->finishedCalls == 1, QStringLiteral("finished once"));
     expect(deleted->total(DeleteAnswers::AssetTotal) == 3 && deleted->total(DeleteAnswers::MetadataTotal) == 3,
@@ -686,7 +691,8 @@ bool Tour::settings()
     app.append(Zel_Setting(QStringLiteral("Recent.Bin"), mDemoBin ? mDemoBin->getName() : QString()));
     auto appStored = boost::make_shared<DoneAnswers<Zel_SetApplicationSettingsCB>>(QStringLiteral("stored"));
     send(mSession->makeSetApplicationSettingsReqSP(application, app.toXML(QStringLiteral("ApplicationSettings")), appStored),
-         QStringLiteral("Zel_SetApplicationSettingsReq for %1: %2").arg(quoted(application), QString(app).replace(QLatin1Char('\n'), QStringLiteral(", "))));
+         QStringLiteral("Zel_SetApplicationSettingsReq for %1:\n        %2")
+             .arg(quoted(application), QString(app).replace(QLatin1Char('\n'), QStringLiteral(", "))));
     expect(appStored->succeededCalls == 1 && appStored->failures.empty(), QStringLiteral("the application settings to be stored"));
 
     auto appAfter = boost::make_shared<TextAnswers<Zel_GetApplicationSettingsCB>>();

@@ -42,7 +42,8 @@ const char* const kUsage =
     "Options:\n"
     "  --tree FILE          tour the asset tree in FILE (JSON, the form\n"
     "                       Zel_MemoryTree saves) instead of the bundled sample\n"
-    "  --user NAME          log in as NAME (default: editor)\n"
+    "  --user NAME          log in as NAME (default: editor; the sample tree's users\n"
+    "                       are admin, editor, producer and assistant, who may only read)\n"
     "  --password TEXT      log in with TEXT (default: the user name, as in the sample)\n"
     "  --trace              turn the library's trace log on and print its lines\n"
     "  --write-sample FILE  write the bundled sample tree to FILE, to edit and tour\n"
@@ -158,7 +159,7 @@ int main(int argc, char** argv)
 
     Console& out = Console::instance();
     out.line(QStringLiteral("zel-demo: a tour of zel, the client interface to a media asset-management server"));
-    out.line(QStringLiteral("Server:   %1, the in-memory backend, with %2 (%3 nodes)")
+    out.line(QStringLiteral("Server:   %1, the in-memory backend,\n          with %2 (%3 nodes)")
                  .arg(quoted(tree->serverName()),
                       options.treeFile.isEmpty() ? QStringLiteral("the bundled sample tree") : QStringLiteral("the tree of ") + options.treeFile,
                       QString::number(tree->nodeCount())));
