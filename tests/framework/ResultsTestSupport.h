@@ -1,6 +1,6 @@
-// Test support for the result and callback catalogue tests: a call log that
-// names the objects handed to handlers and can make a handler throw, and
-// recording implementations of the callbacks that results of the library call.
+// Test support for the result tests: a call log that names the objects handed
+// to handlers and can make a handler throw, recording implementations of the
+// callbacks that results of the library call, and a member-order probe.
 #ifndef ZEL_TESTS_RESULTSTESTSUPPORT_H
 #define ZEL_TESTS_RESULTSTESTSUPPORT_H
 
@@ -17,6 +17,9 @@
 #include "Zel_GetReservationsCB.h"
 #include "Zel_GetUserSettingsCB.h"
 #include "Zel_MediaResolutionsCB.h"
+#include "Zel_MobDesc.h"
+#include "Zel_MobID.h"
+#include "Zel_Node.h"
 #include "Zel_NodePermissionsCB.h"
 #include "Zel_NodeResolutionsCB.h"
 #include "Zel_RemoveReservationCB.h"
@@ -33,19 +36,26 @@
 #include <boost/make_shared.hpp>
 #include <boost/shared_ptr.hpp>
 
+#include <algorithm>
+#include <cstdint>
 #include <map>
 #include <set>
 #include <stdexcept>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace ResultsTest {
 
 using Calls = std::vector<std::string>;
+using ErrorSP = boost::shared_ptr<Zel_Error>;
+using MobIDSP = boost::shared_ptr<Zel_MobID>;
+using NodeSP = boost::shared_ptr<Zel_Node>;
+using TextSP = boost::shared_ptr<QString>;
 
-// The calls that reached the handlers, as text, in order. Objects registered
-// with named() appear under their name; an unregistered object as "anon", an
-// empty pointer as "null".
+// The calls that reached the handlers, as "handler(arg,...)", in order. Objects
+// made or registered here appear under their name; any other object as
+// "anon", an empty pointer as "null".
 class CallLog
 {
 public:
@@ -55,26 +65,46 @@ public:
         mNames[object.get()] = name;
         return object;
     }
+    NodeSP node(const std::string& name) { return named(boost::make_shared<Zel_Node>(QString::fromStdString(name)), name); }
+    MobIDSP mob(const std::string& name) { return named(boost::make_shared<Zel_MobID>(QString::fromStdString(name)), name); }
+    TextSP text(const std::string& name) { return named(boost::make_shared<QString>(QString::fromStdString(name)), name); }
+    boost::shared_ptr<Zel_MobDesc> desc(const std::string& name)
+    {
+        return named(boost::make_shared<Zel_MobDesc>(QString::fromStdString(name), QString(), QString()), name);
+    }
+    // An error record (code 7 unless told).
+    ErrorSP error(const std::string& name, int code = 7)
+    {
+        return named(boost::make_shared<Zel_Error>(code, QStringLiteral("failure")), name);
+    }
 
     template <class T>
-    std::string name(const boost::shared_ptr<T>& object) const
+    std::string arg(const boost::shared_ptr<T>& object) const
     {
         if (!object)
             return "null";
         auto it = mNames.find(object.get());
         return it == mNames.end() ? std::string("anon") : it->second;
     }
+    std::string arg(const QString& value) const { return value.toStdString(); }
+    std::string arg(bool value) const { return value ? "true" : "false"; }
+    std::string arg(long value) const { return std::to_string(value); }
 
     // Makes the handler call with this 1-based number throw: a std exception
     // or, with foreign, an int.
-    void throwAt(std::size_t callNumber, bool foreign = false)
-    {
-        (foreign ? mThrowForeign : mThrowStd).insert(callNumber);
-    }
+    void throwAt(std::size_t callNumber, bool foreign = false) { (foreign ? mThrowForeign : mThrowStd).insert(callNumber); }
 
-    void record(std::string call)
+    template <class... Args>
+    void call(const char* handler, const Args&... args)
     {
-        calls.push_back(std::move(call));
+        std::string line = std::string(handler) + "(";
+        bool first = true;
+        ((line += (first ? "" : ",") + arg(args), first = false), ...);
+        record(line + ")");
+    }
+    void record(std::string line)
+    {
+        calls.push_back(std::move(line));
         if (mThrowStd.count(calls.size()))
             throw std::runtime_error("handler failure");
         if (mThrowForeign.count(calls.size()))
@@ -89,14 +119,10 @@ private:
     std::set<std::size_t> mThrowForeign;
 };
 
-inline std::string text(const QString& value)
+// A success record (code -1).
+inline ErrorSP ok()
 {
-    return value.toStdString();
-}
-
-inline std::string flag(bool value)
-{
-    return value ? "true" : "false";
+    return boost::make_shared<Zel_Error>();
 }
 
 // failed(error) and finished() of the common callback shape.
@@ -105,216 +131,124 @@ class Recording : public Base
 {
 public:
     explicit Recording(CallLog& log) : mLog(log) {}
-    void failed(boost::shared_ptr<Zel_Error> error) override { mLog.record("failed(" + mLog.name(error) + ")"); }
-    void finished() override { mLog.record("finished()"); }
+    void failed(ErrorSP error) override { mLog.call(__func__, error); }
+    void finished() override { mLog.call(__func__); }
 
 protected:
     CallLog& mLog;
 };
 
-// Callbacks whose succeeded receives one node.
+// Callbacks whose succeeded receives one node, nothing, or one text.
 template <class Base>
-class NodeCB : public Recording<Base>
-{
-public:
+struct NodeCB : Recording<Base> {
     using Recording<Base>::Recording;
-    void succeeded(boost::shared_ptr<Zel_Node> node) override
-    {
-        this->mLog.record("succeeded(" + this->mLog.name(node) + ")");
-    }
+    void succeeded(NodeSP node) override { this->mLog.call(__func__, node); }
 };
-
-// Callbacks whose succeeded receives nothing.
 template <class Base>
-class VoidCB : public Recording<Base>
-{
-public:
+struct VoidCB : Recording<Base> {
     using Recording<Base>::Recording;
-    void succeeded() override { this->mLog.record("succeeded()"); }
+    void succeeded() override { this->mLog.call(__func__); }
 };
-
-// Callbacks whose succeeded receives one text.
 template <class Base>
-class TextCB : public Recording<Base>
-{
-public:
+struct TextCB : Recording<Base> {
     using Recording<Base>::Recording;
-    void succeeded(QString value) override { this->mLog.record("succeeded(" + text(value) + ")"); }
+    void succeeded(QString value) override { this->mLog.call(__func__, value); }
 };
 
-class ResultBoolCB : public Recording<Zel_ResultBoolCB>
-{
-public:
+struct ResultBoolCB : Recording<Zel_ResultBoolCB> {
     using Recording::Recording;
-    void succeeded(bool deleted) override { mLog.record("succeeded(" + flag(deleted) + ")"); }
+    void succeeded(bool deleted) override { mLog.call(__func__, deleted); }
 };
-
-class AssociationsCB : public Recording<Zel_AssociationsCB>
-{
-public:
+struct AssociationsCB : Recording<Zel_AssociationsCB> {
     using Recording::Recording;
-    void succeeded(boost::shared_ptr<Zel_Directory> directory) override
-    {
-        mLog.record("succeeded(" + mLog.name(directory) + ")");
-    }
+    void succeeded(boost::shared_ptr<Zel_Directory> directory) override { mLog.call(__func__, directory); }
 };
-
-class GetReservationsCB : public Recording<Zel_GetReservationsCB>
-{
-public:
+struct GetReservationsCB : Recording<Zel_GetReservationsCB> {
     using Recording::Recording;
-    void succeeded(QString value, QDateTime dateTime) override
-    {
-        mLog.record("succeeded(" + text(value) + "," + text(dateTime.toString(Qt::ISODate)) + ")");
-    }
+    void succeeded(QString value, QDateTime when) override { mLog.call(__func__, value, when.toString(Qt::ISODate)); }
 };
-
-class GetUserSettingsCB : public Recording<Zel_GetUserSettingsCB>
-{
-public:
+struct GetUserSettingsCB : Recording<Zel_GetUserSettingsCB> {
     using Recording::Recording;
-    void succeeded(UserSettingsType type, QString value) override
-    {
-        mLog.record("succeeded(" + std::to_string(static_cast<long long>(type)) + "," + text(value) + ")");
-    }
+    void succeeded(UserSettingsType type, QString value) override { mLog.call(__func__, long(type), value); }
 };
-
-class NodePermissionsCB : public Recording<Zel_NodePermissionsCB>
-{
-public:
+struct NodePermissionsCB : Recording<Zel_NodePermissionsCB> {
     using Recording::Recording;
-    void succeeded(boost::shared_ptr<Zel_NodePermissions> permissions) override
-    {
-        mLog.record("succeeded(" + mLog.name(permissions) + ")");
-    }
+    void succeeded(boost::shared_ptr<Zel_NodePermissions> permissions) override { mLog.call(__func__, permissions); }
 };
-
-class NodeResolutionsCB : public Recording<Zel_NodeResolutionsCB>
-{
-public:
+struct NodeResolutionsCB : Recording<Zel_NodeResolutionsCB> {
     using Recording::Recording;
-    void succeeded(boost::shared_ptr<Zel_MobID> mobID, boost::shared_ptr<QString> value) override
-    {
-        mLog.record("succeeded(" + mLog.name(mobID) + "," + mLog.name(value) + ")");
-    }
+    void succeeded(MobIDSP mobID, TextSP value) override { mLog.call(__func__, mobID, value); }
 };
 
-class ChildrenCB : public Zel_ChildrenCB
-{
-public:
+struct ChildrenCB : Zel_ChildrenCB {
     explicit ChildrenCB(CallLog& log) : mLog(log) {}
-    void succeeded(boost::shared_ptr<Zel_Node> node, bool value) override
-    {
-        mLog.record("succeeded(" + mLog.name(node) + "," + flag(value) + ")");
-    }
-    void succeeded(boost::shared_ptr<Zel_Node> first, boost::shared_ptr<Zel_Node> second) override
-    {
-        mLog.record("succeeded(" + mLog.name(first) + "," + mLog.name(second) + ")");
-    }
-    void failed(boost::shared_ptr<Zel_Node> node, boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("failed(" + mLog.name(node) + "," + mLog.name(error) + ")");
-    }
-    void finished() override { mLog.record("finished()"); }
-
-private:
+    void succeeded(NodeSP node, bool value) override { mLog.call(__func__, node, value); }
+    void succeeded(NodeSP first, NodeSP second) override { mLog.call(__func__, first, second); }
+    void failed(NodeSP node, ErrorSP error) override { mLog.call(__func__, node, error); }
+    void finished() override { mLog.call(__func__); }
     CallLog& mLog;
 };
 
-class CheckinCB : public Zel_CheckinCB
-{
-public:
+struct CheckinCB : Zel_CheckinCB {
     explicit CheckinCB(CallLog& log) : mLog(log) {}
-    void succeeded(boost::shared_ptr<Zel_MobDesc> mobDesc, boost::shared_ptr<Zel_Node> node,
-                   boost::shared_ptr<QString> value) override
+    void succeeded(boost::shared_ptr<Zel_MobDesc> desc, NodeSP node, TextSP text) override
     {
-        mLog.record("succeeded(" + mLog.name(mobDesc) + "," + mLog.name(node) + "," + mLog.name(value) + ")");
+        mLog.call(__func__, desc, node, text);
     }
-    void failed(boost::shared_ptr<Zel_MobDesc> mobDesc, boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("failed(" + mLog.name(mobDesc) + "," + mLog.name(error) + ")");
-    }
-    void finished() override { mLog.record("finished()"); }
-
-private:
+    void failed(boost::shared_ptr<Zel_MobDesc> desc, ErrorSP error) override { mLog.call(__func__, desc, error); }
+    void finished() override { mLog.call(__func__); }
     CallLog& mLog;
 };
 
-class StartupCB : public Zel_StartupCB
-{
-public:
+struct StartupCB : Zel_StartupCB {
     explicit StartupCB(CallLog& log) : mLog(log) {}
-    void succeeded() override { mLog.record("succeeded()"); }
-    void failed(boost::shared_ptr<Zel_Error> error) override { mLog.record("failed(" + mLog.name(error) + ")"); }
-
-private:
+    void succeeded() override { mLog.call(__func__); }
+    void failed(ErrorSP error) override { mLog.call(__func__, error); }
     CallLog& mLog;
 };
 
-class DeleteCB : public Zel_DeleteCB
-{
-public:
+struct DeleteCB : Zel_DeleteCB {
     explicit DeleteCB(CallLog& log) : mLog(log) {}
-    void remoteAssetDeleteSuccessTotalResult(long count) override
+    void remoteAssetDeleteSuccessTotalResult(long count) override { mLog.call(__func__, count); }
+    void remoteMetadataDeleteSuccessTotalResult(long count) override { mLog.call(__func__, count); }
+    void remoteMetadataDeleteErrorPartialResult(MobIDSP mob, ErrorSP error) override { mLog.call(__func__, mob, error); }
+    void remoteMediaDeleteSuccessPartialResult(MobIDSP mob) override { mLog.call(__func__, mob); }
+    void remoteMediaDeleteErrorPartialResult(TextSP t1, TextSP t2, TextSP t3, TextSP t4, TextSP t5, ErrorSP error) override
     {
-        mLog.record("remoteAssetDeleteSuccessTotalResult(" + std::to_string(count) + ")");
+        mLog.call(__func__, t1, t2, t3, t4, t5, error);
     }
-    void remoteMetadataDeleteSuccessTotalResult(long count) override
+    void localDeleteMediaSuccessPartialResult(MobIDSP mob) override { mLog.call(__func__, mob); }
+    void localDeleteMediaErrorPartialResult(TextSP t1, TextSP t2, TextSP t3, TextSP t4, ErrorSP error) override
     {
-        mLog.record("remoteMetadataDeleteSuccessTotalResult(" + std::to_string(count) + ")");
+        mLog.call(__func__, t1, t2, t3, t4, error);
     }
-    void remoteMetadataDeleteErrorPartialResult(boost::shared_ptr<Zel_MobID> mobID,
-                                                boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("remoteMetadataDeleteErrorPartialResult(" + mLog.name(mobID) + "," + mLog.name(error) + ")");
-    }
-    void remoteMediaDeleteSuccessPartialResult(boost::shared_ptr<Zel_MobID> mobID) override
-    {
-        mLog.record("remoteMediaDeleteSuccessPartialResult(" + mLog.name(mobID) + ")");
-    }
-    void remoteMediaDeleteErrorPartialResult(boost::shared_ptr<QString> t1, boost::shared_ptr<QString> t2,
-                                             boost::shared_ptr<QString> t3, boost::shared_ptr<QString> t4,
-                                             boost::shared_ptr<QString> t5, boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("remoteMediaDeleteErrorPartialResult(" + mLog.name(t1) + "," + mLog.name(t2) + "," +
-                    mLog.name(t3) + "," + mLog.name(t4) + "," + mLog.name(t5) + "," + mLog.name(error) + ")");
-    }
-    void localDeleteMediaSuccessPartialResult(boost::shared_ptr<Zel_MobID> mobID) override
-    {
-        mLog.record("localDeleteMediaSuccessPartialResult(" + mLog.name(mobID) + ")");
-    }
-    void localDeleteMediaErrorPartialResult(boost::shared_ptr<QString> t1, boost::shared_ptr<QString> t2,
-                                            boost::shared_ptr<QString> t3, boost::shared_ptr<QString> t4,
-                                            boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("localDeleteMediaErrorPartialResult(" + mLog.name(t1) + "," + mLog.name(t2) + "," +
-                    mLog.name(t3) + "," + mLog.name(t4) + "," + mLog.name(error) + ")");
-    }
-    void localDeleteMobNotFoundErrorPartialResult(boost::shared_ptr<Zel_MobID> mobID,
-                                                  boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("localDeleteMobNotFoundErrorPartialResult(" + mLog.name(mobID) + "," + mLog.name(error) + ")");
-    }
-    void errorResult(boost::shared_ptr<Zel_Error> error) override
-    {
-        mLog.record("errorResult(" + mLog.name(error) + ")");
-    }
-    void finished() override { mLog.record("finished()"); }
-
-private:
+    void localDeleteMobNotFoundErrorPartialResult(MobIDSP mob, ErrorSP error) override { mLog.call(__func__, mob, error); }
+    void errorResult(ErrorSP error) override { mLog.call(__func__, error); }
+    void finished() override { mLog.call(__func__); }
     CallLog& mLog;
 };
 
-// A success record (code -1) and an error record, registered under a name.
-inline boost::shared_ptr<Zel_Error> success(CallLog& log, const std::string& name)
+// The given members of one object in address order, as "a<b<c".
+inline std::string memberOrder(std::vector<std::pair<const void*, std::string>> members)
 {
-    return log.named(boost::make_shared<Zel_Error>(), name);
+    std::sort(members.begin(), members.end(), [](const auto& a, const auto& b) {
+        return reinterpret_cast<std::uintptr_t>(a.first) < reinterpret_cast<std::uintptr_t>(b.first);
+    });
+    std::string order;
+    for (const auto& member : members)
+        order += (order.empty() ? "" : "<") + member.second;
+    return order;
 }
 
-inline boost::shared_ptr<Zel_Error> failure(CallLog& log, const std::string& name, int code = 7)
-{
-    return log.named(boost::make_shared<Zel_Error>(code, QStringLiteral("failure")), name);
-}
+// A result of the generic shape whose field order can be read.
+template <class Res>
+struct Layout : Res {
+    using Res::Res;
+    std::string order() const
+    {
+        return memberOrder({{&this->mItems, "items"}, {&this->mCursor, "cursor"}, {&this->mCallback, "callback"}});
+    }
+};
 
 } // namespace ResultsTest
 

@@ -3,7 +3,6 @@
 #include "ResultsTestSupport.h"
 
 #include "Zel_DeleteRes.h"
-#include "Zel_MobID.h"
 
 #include <gtest/gtest.h>
 
@@ -13,87 +12,71 @@ using namespace ResultsTest;
 
 namespace {
 
-boost::shared_ptr<Zel_MobID> mob(CallLog& log, const std::string& name)
-{
-    return log.named(boost::make_shared<Zel_MobID>(QString::fromStdString(name)), name);
-}
-
-boost::shared_ptr<QString> txt(CallLog& log, const std::string& name)
-{
-    return log.named(boost::make_shared<QString>(QString::fromStdString(name)), name);
-}
-
-class InspectableDeleteRes : public Zel_DeleteRes
-{
-public:
+struct InspectableDeleteRes : Zel_DeleteRes {
     using Zel_DeleteRes::Zel_DeleteRes;
     const QList<boost::shared_ptr<ResultItem>>& items() const { return mItems; }
 };
 
 } // namespace
 
-TEST(Zel_DeleteResTest, DeliversTotalsAndPartialsInStorageOrderThenFinishes)
+TEST(Zel_DeleteResTest, EveryItemKindReachesItsOwnHandlerWithArgumentsInStorageOrderThenFinishes)
 {
+    for (bool finalResult : {true, false}) {
+        CallLog log;
+        Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), finalResult);
+        result.setRemoteAssetDeleteSuccessTotalResult(LONG_MAX, ok());
+        result.setRemoteMetadataDeleteSuccessTotalResult(LONG_MIN, ok());
+        result.setRemoteMetadataDeleteErrorPartialResult(log.mob("m1"), log.error("e3"));
+        result.setRemoteMediaDeleteSuccessPartialResult(log.mob("m2"), ok());
+        result.setRemoteMediaDeleteErrorPartialResult(log.text("a"), log.text("b"), log.text("c"), log.text("d"),
+                                                      log.text("e"), log.error("e5"));
+        result.setLocalDeleteMediaSuccessPartialResult(log.mob("m3"), ok());
+        result.setLocalDeleteMediaErrorPartialResult(log.text("w"), log.text("x"), log.text("y"), log.text("z"),
+                                                     log.error("e7"));
+        result.setLocalDeleteMobNotFoundErrorPartialResult(log.mob("m4"), log.error("e8"));
+        result.setErrorResult(log.error("e9"));
+        result.setErrorResult(log.error("e10"));
+        EXPECT_TRUE(log.calls.empty()) << "setters never deliver";
+
+        EXPECT_TRUE(result.deliverNext());
+        EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(" + std::to_string(LONG_MAX) + ")"}));
+        int trueAnswers = 1;
+        while (result.deliverNext())
+            ++trueAnswers;
+        EXPECT_EQ(trueAnswers, 9);
+        Calls expected{
+            "remoteAssetDeleteSuccessTotalResult(" + std::to_string(LONG_MAX) + ")",
+            "remoteMetadataDeleteSuccessTotalResult(" + std::to_string(LONG_MIN) + ")",
+            "remoteMetadataDeleteErrorPartialResult(m1,e3)",
+            "remoteMediaDeleteSuccessPartialResult(m2)",
+            "remoteMediaDeleteErrorPartialResult(a,b,c,d,e,e5)",
+            "localDeleteMediaSuccessPartialResult(m3)",
+            "localDeleteMediaErrorPartialResult(w,x,y,z,e7)",
+            "localDeleteMobNotFoundErrorPartialResult(m4,e8)",
+            "errorResult(e9)",
+            "errorResult(e10)",
+        };
+        if (finalResult)
+            expected.push_back("finished()");
+        EXPECT_EQ(log.calls, expected) << (finalResult ? "final" : "not final");
+    }
+
     CallLog log;
-    Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), true);
-    auto e = failure(log, "e");
-    result.setRemoteAssetDeleteSuccessTotalResult(3, success(log, "ok"));
-    result.setRemoteMediaDeleteSuccessPartialResult(mob(log, "m1"), success(log, "ok"));
-    result.setLocalDeleteMobNotFoundErrorPartialResult(mob(log, "m2"), e);
-    EXPECT_TRUE(log.calls.empty()) << "setters never deliver";
-
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(3)"}));
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(3)", "remoteMediaDeleteSuccessPartialResult(m1)",
-                                "localDeleteMobNotFoundErrorPartialResult(m2,e)", "finished()"}));
-}
-
-TEST(Zel_DeleteResTest, EveryItemKindReachesItsOwnHandlerWithArgumentsInOrder)
-{
-    CallLog log;
-    Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), false);
-    result.setRemoteAssetDeleteSuccessTotalResult(5, success(log, "ok"));
-    result.setRemoteMetadataDeleteSuccessTotalResult(-2, success(log, "ok"));
-    result.setRemoteMetadataDeleteErrorPartialResult(mob(log, "m1"), failure(log, "e3"));
-    result.setRemoteMediaDeleteSuccessPartialResult(mob(log, "m2"), success(log, "ok"));
-    result.setRemoteMediaDeleteErrorPartialResult(txt(log, "a"), txt(log, "b"), txt(log, "c"), txt(log, "d"),
-                                                  txt(log, "e"), failure(log, "e5"));
-    result.setLocalDeleteMediaSuccessPartialResult(mob(log, "m3"), success(log, "ok"));
-    result.setLocalDeleteMediaErrorPartialResult(txt(log, "w"), txt(log, "x"), txt(log, "y"), txt(log, "z"),
-                                                 failure(log, "e7"));
-    result.setLocalDeleteMobNotFoundErrorPartialResult(mob(log, "m4"), failure(log, "e8"));
-    result.setErrorResult(failure(log, "e9"));
-    result.setErrorResult(failure(log, "e10"));
-
-    int trueAnswers = 0;
-    while (result.deliverNext())
-        ++trueAnswers;
-    EXPECT_EQ(trueAnswers, 9);
-    EXPECT_EQ(log.calls, (Calls{
-                             "remoteAssetDeleteSuccessTotalResult(5)",
-                             "remoteMetadataDeleteSuccessTotalResult(-2)",
-                             "remoteMetadataDeleteErrorPartialResult(m1,e3)",
-                             "remoteMediaDeleteSuccessPartialResult(m2)",
-                             "remoteMediaDeleteErrorPartialResult(a,b,c,d,e,e5)",
-                             "localDeleteMediaSuccessPartialResult(m3)",
-                             "localDeleteMediaErrorPartialResult(w,x,y,z,e7)",
-                             "localDeleteMobNotFoundErrorPartialResult(m4,e8)",
-                             "errorResult(e9)",
-                             "errorResult(e10)",
-                         }))
-        << "not final: no finished()";
+    Zel_DeleteRes partial(boost::make_shared<DeleteCB>(log), false);
+    EXPECT_FALSE(partial.deliverNext());
+    Zel_DeleteRes finalRes(boost::make_shared<DeleteCB>(log), true);
+    EXPECT_FALSE(finalRes.deliverNext());
+    EXPECT_EQ(log.calls, (Calls{"finished()"})) << "an empty result finishes only when final";
 }
 
 TEST(Zel_DeleteResTest, SuccessItemsWithAnErrorRecordStillReachTheirSuccessHandler)
 {
     CallLog log;
     Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), true);
-    result.setRemoteAssetDeleteSuccessTotalResult(1, failure(log, "e1"));
-    result.setRemoteMetadataDeleteSuccessTotalResult(2, failure(log, "e2", 0));
-    result.setRemoteMediaDeleteSuccessPartialResult(mob(log, "m"), failure(log, "e3"));
-    result.setLocalDeleteMediaSuccessPartialResult(mob(log, "n"), failure(log, "e4"));
+    result.setRemoteAssetDeleteSuccessTotalResult(1, log.error("e1"));
+    result.setRemoteMetadataDeleteSuccessTotalResult(2, log.error("e2", 0));
+    result.setRemoteMediaDeleteSuccessPartialResult(log.mob("m"), log.error("e3"));
+    result.setLocalDeleteMediaSuccessPartialResult(log.mob("n"), log.error("e4"));
     EXPECT_TRUE(result.isCurrentResultError()) << "the record still classifies the item";
     EXPECT_TRUE(result.deliverNext());
     EXPECT_TRUE(result.deliverNext());
@@ -104,29 +87,16 @@ TEST(Zel_DeleteResTest, SuccessItemsWithAnErrorRecordStillReachTheirSuccessHandl
                                 "finished()"}));
 }
 
-TEST(Zel_DeleteResTest, EmptyResultsFinishOnlyWhenFinal)
-{
-    CallLog log;
-    Zel_DeleteRes partial(boost::make_shared<DeleteCB>(log), false);
-    EXPECT_FALSE(partial.deliverNext());
-    EXPECT_TRUE(log.calls.empty());
-
-    Zel_DeleteRes finalRes(boost::make_shared<DeleteCB>(log), true);
-    EXPECT_FALSE(finalRes.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"finished()"}));
-}
-
 TEST(Zel_DeleteResTest, NullErrorRecordsAreStoredAsNoErrorAndNeverReadThrough)
 {
     CallLog log;
     InspectableDeleteRes result(boost::make_shared<DeleteCB>(log), false);
-    result.setErrorResult(boost::shared_ptr<Zel_Error>());
-    result.setRemoteMetadataDeleteErrorPartialResult(mob(log, "m"), boost::shared_ptr<Zel_Error>());
-    result.setRemoteAssetDeleteSuccessTotalResult(4, boost::shared_ptr<Zel_Error>());
+    result.setErrorResult(ErrorSP());
+    result.setRemoteMetadataDeleteErrorPartialResult(log.mob("m"), ErrorSP());
+    result.setRemoteAssetDeleteSuccessTotalResult(4, ErrorSP());
     ASSERT_EQ(result.items().size(), 3);
     for (const auto& item : result.items()) {
         ASSERT_TRUE(item->mError);
-        EXPECT_FALSE(item->mError->isError());
         EXPECT_EQ(item->mError->getCode(), -1);
     }
     EXPECT_FALSE(result.isCurrentResultError());
@@ -145,9 +115,9 @@ TEST(Zel_DeleteResTest, HandlerExceptionsAndAnEmptyCallbackLoseNoItem)
         CallLog log;
         log.throwAt(throwingCall, throwingCall == 2);
         Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), true);
-        result.setErrorResult(failure(log, "e1"));
-        result.setRemoteMediaDeleteSuccessPartialResult(mob(log, "m"), success(log, "ok"));
-        result.setRemoteAssetDeleteSuccessTotalResult(9, success(log, "ok"));
+        result.setErrorResult(log.error("e1"));
+        result.setRemoteMediaDeleteSuccessPartialResult(log.mob("m"), ok());
+        result.setRemoteAssetDeleteSuccessTotalResult(9, ok());
         EXPECT_TRUE(result.deliverNext());
         EXPECT_TRUE(result.deliverNext());
         EXPECT_FALSE(result.deliverNext());
@@ -157,13 +127,13 @@ TEST(Zel_DeleteResTest, HandlerExceptionsAndAnEmptyCallbackLoseNoItem)
 
     Zel_DeleteRes orphan(boost::shared_ptr<Zel_DeleteCB>(), true);
     orphan.setErrorResult(boost::make_shared<Zel_Error>(1, QString()));
-    orphan.setLocalDeleteMediaSuccessPartialResult(boost::make_shared<Zel_MobID>(), boost::make_shared<Zel_Error>());
+    orphan.setLocalDeleteMediaSuccessPartialResult(boost::make_shared<Zel_MobID>(), ok());
     EXPECT_TRUE(orphan.deliverNext());
     EXPECT_FALSE(orphan.deliverNext());
     EXPECT_FALSE(orphan.haveResults());
 
     // An item handed an empty callback calls nothing.
-    Zel_DeleteRes::ResultItem item(boost::make_shared<Zel_Error>());
+    Zel_DeleteRes::ResultItem item(ok());
     item.deliver(boost::shared_ptr<Zel_DeleteCB>());
 }
 
@@ -171,8 +141,8 @@ TEST(Zel_DeleteResTest, CopiesShareTheItemObjectsAndKeepTheirOwnCursor)
 {
     CallLog log;
     InspectableDeleteRes original(boost::make_shared<DeleteCB>(log), true);
-    original.setRemoteAssetDeleteSuccessTotalResult(1, success(log, "ok"));
-    original.setErrorResult(failure(log, "e"));
+    original.setRemoteAssetDeleteSuccessTotalResult(1, ok());
+    original.setErrorResult(log.error("e"));
     EXPECT_TRUE(original.deliverNext());
 
     InspectableDeleteRes copy(original);
@@ -183,16 +153,4 @@ TEST(Zel_DeleteResTest, CopiesShareTheItemObjectsAndKeepTheirOwnCursor)
     EXPECT_FALSE(original.deliverNext());
     EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(1)", "errorResult(e)", "finished()",
                                 "errorResult(e)", "finished()"}));
-}
-
-TEST(Zel_DeleteResTest, TotalsKeepTheFullRangeOfLong)
-{
-    CallLog log;
-    Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), false);
-    result.setRemoteAssetDeleteSuccessTotalResult(LONG_MAX, success(log, "ok"));
-    result.setRemoteMetadataDeleteSuccessTotalResult(LONG_MIN, success(log, "ok"));
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(" + std::to_string(LONG_MAX) + ")",
-                                "remoteMetadataDeleteSuccessTotalResult(" + std::to_string(LONG_MIN) + ")"}));
 }

@@ -1,9 +1,9 @@
-// The generic results: each stores its payload with an error record and hands
-// the payload (and only that) to its callback, one answer per deliverNext().
+// The delivery protocol of Zel_Res and the generic results built on it: each
+// stores its payload with an error record and hands the payload (and only
+// that) to its callback, one answer per deliverNext().
 #include "ResultsTestSupport.h"
 
 #include "Orv_Engine.h"
-#include "Orv_ResultQ.h"
 #include "Zel_AssociationsRes.h"
 #include "Zel_ChildrenRes.h"
 #include "Zel_CreateFolderUniqueRes.h"
@@ -20,8 +20,6 @@
 #include "Zel_GetSyncedProjRootRes.h"
 #include "Zel_GetUserSettingsRes.h"
 #include "Zel_MediaResolutionsRes.h"
-#include "Zel_MobID.h"
-#include "Zel_Node.h"
 #include "Zel_NodePermissions.h"
 #include "Zel_NodePermissionsRes.h"
 #include "Zel_NodeResolutionsRes.h"
@@ -40,9 +38,18 @@ using namespace ResultsTest;
 
 namespace {
 
-boost::shared_ptr<Zel_Node> node(CallLog& log, const std::string& name)
+// Calls deliverNext() until it answers false; the answers, e.g. "TTF".
+template <class Res>
+std::string deliverAll(Res& result)
 {
-    return log.named(boost::make_shared<Zel_Node>(QString::fromStdString(name)), name);
+    std::string answers;
+    for (int i = 0; i < 20; ++i) {
+        const bool more = result.deliverNext();
+        answers += more ? 'T' : 'F';
+        if (!more)
+            break;
+    }
+    return answers;
 }
 
 // Fills a result of the node family with (n1, ok), (n2, e2), (n3, ok) and
@@ -51,13 +58,12 @@ template <class Res, class CB>
 void expectNodeResultDelivery()
 {
     for (bool finalResult : {true, false}) {
-        SCOPED_TRACE(finalResult ? "final" : "not final");
+        SCOPED_TRACE(std::string(typeid(Res).name()) + (finalResult ? " final" : " not final"));
         CallLog log;
-        auto callback = boost::make_shared<NodeCB<CB>>(log);
-        Res result(callback, finalResult);
-        result.setResult(node(log, "n1"), success(log, "ok"));
-        result.setResult(node(log, "n2"), failure(log, "e2"));
-        result.setResult(node(log, "n3"), success(log, "ok3"));
+        Res result(boost::make_shared<NodeCB<CB>>(log), finalResult);
+        result.setResult(log.node("n1"), ok());
+        result.setResult(log.node("n2"), log.error("e2"));
+        result.setResult(log.node("n3"), ok());
         EXPECT_TRUE(log.calls.empty()) << "setResult never delivers";
 
         EXPECT_TRUE(result.deliverNext());
@@ -78,96 +84,41 @@ template <class Res, class CB>
 void expectErrorOnlyDelivery()
 {
     CallLog log;
-    auto callback = boost::make_shared<VoidCB<CB>>(log);
-    Res result(callback, true);
-    result.setResult(success(log, "ok"));
-    result.setResult(failure(log, "e2"));
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"succeeded()", "failed(e2)", "finished()"}));
+    Res result(boost::make_shared<VoidCB<CB>>(log), true);
+    result.setResult(ok());
+    result.setResult(log.error("e2"));
+    EXPECT_EQ(deliverAll(result), "TF");
+    EXPECT_EQ(log.calls, (Calls{"succeeded()", "failed(e2)", "finished()"})) << typeid(Res).name();
 }
 
 template <class Res, class CB>
 void expectTextDelivery()
 {
     CallLog log;
-    auto callback = boost::make_shared<TextCB<CB>>(log);
-    Res result(callback, true);
-    result.setResult(QStringLiteral("<settings/>"), success(log, "ok"));
-    result.setResult(QStringLiteral("ignored"), failure(log, "e2"));
-    result.setResult(QString(), success(log, "ok3"));
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"succeeded(<settings/>)", "failed(e2)", "succeeded()", "finished()"}));
+    Res result(boost::make_shared<TextCB<CB>>(log), true);
+    result.setResult(QStringLiteral("<settings/>"), ok());
+    result.setResult(QStringLiteral("ignored"), log.error("e2"));
+    result.setResult(QString(), ok());
+    EXPECT_EQ(deliverAll(result), "TTF");
+    EXPECT_EQ(log.calls, (Calls{"succeeded(<settings/>)", "failed(e2)", "succeeded()", "finished()"}))
+        << typeid(Res).name();
 }
 
-// Gives a test access to the stored items and the field layout.
-class InspectableMediaResolutionsRes : public Zel_MediaResolutionsRes
-{
-public:
+// Gives a test access to the stored items.
+struct InspectableMediaResolutionsRes : Zel_MediaResolutionsRes {
     using Zel_MediaResolutionsRes::Zel_MediaResolutionsRes;
     const std::vector<ResultItem>& items() const { return mItems; }
 };
 
-class MediaResolutionsCB : public Recording<Zel_MediaResolutionsCB>
-{
-public:
+struct MediaResolutionsCB : Recording<Zel_MediaResolutionsCB> {
     using Recording::Recording;
     void succeeded(Zel_PropertyKeyInfoList resolutions) override
     {
-        mLog.record("succeeded(" + text(resolutions.toZelString()) + ")");
+        mLog.call(__func__, resolutions.toZelString());
         // The handler's copy is its own: changing it must not reach the result.
-        resolutions.addIfKeyNotInList(
-            Zel_PropertyKeyInfo(QStringLiteral("Added"), QStringLiteral("Added"), true, true, QStringLiteral("added"),
-                                Zel_PropertyKeyType(1), false, false));
+        resolutions.addIfKeyNotInList(Zel_PropertyKeyInfo(QStringLiteral("Added"), QStringLiteral("Added"), true, true,
+                                                          QStringLiteral("added"), Zel_PropertyKeyType(1), false, false));
         resolutions.clear();
-    }
-};
-
-Zel_PropertyKeyInfo keyInfo(const char* key)
-{
-    const QString name = QString::fromLatin1(key);
-    return Zel_PropertyKeyInfo(name, name + QStringLiteral(" Display"), false, true, name.toLower(),
-                               Zel_PropertyKeyType(2), false, false);
-}
-
-template <class Layout>
-std::ptrdiff_t offsetIn(const Layout& object, const void* member)
-{
-    return static_cast<const char*>(member) - reinterpret_cast<const char*>(&object);
-}
-
-class LayoutNodePermissionsRes : public Zel_NodePermissionsRes
-{
-public:
-    using Zel_NodePermissionsRes::Zel_NodePermissionsRes;
-    bool itemsAndCursorBeforeCallback() const
-    {
-        return offsetIn(*this, &mItems) < offsetIn(*this, &mCursor) &&
-               offsetIn(*this, &mCursor) < offsetIn(*this, &mCallback);
-    }
-};
-
-class LayoutAssociationsRes : public Zel_AssociationsRes
-{
-public:
-    using Zel_AssociationsRes::Zel_AssociationsRes;
-    bool itemsAndCursorBeforeCallback() const
-    {
-        return offsetIn(*this, &mItems) < offsetIn(*this, &mCursor) &&
-               offsetIn(*this, &mCursor) < offsetIn(*this, &mCallback);
-    }
-};
-
-class LayoutGetNodeRes : public Zel_GetNodeRes
-{
-public:
-    using Zel_GetNodeRes::Zel_GetNodeRes;
-    bool callbackBeforeItemsAndCursor() const
-    {
-        return offsetIn(*this, &mCallback) < offsetIn(*this, &mItems) &&
-               offsetIn(*this, &mItems) < offsetIn(*this, &mCursor);
     }
 };
 
@@ -184,16 +135,12 @@ TEST(Zel_GenericResTest, NodeResultsHandEachNodeToItsHandlerAndFinishOnlyWhenFin
     expectNodeResultDelivery<Zel_RenameUniqueRes, Zel_RenameUniqueCB>();
 }
 
-TEST(Zel_GenericResTest, ErrorOnlyResultsCallSucceededWithoutArguments)
+TEST(Zel_GenericResTest, ErrorOnlyAndTextResultsHandOverNothingOrTheTextUnchanged)
 {
     expectErrorOnlyDelivery<Zel_CreateReservationRes, Zel_CreateReservationCB>();
     expectErrorOnlyDelivery<Zel_RemoveReservationRes, Zel_RemoveReservationCB>();
     expectErrorOnlyDelivery<Zel_SetApplicationSettingsRes, Zel_SetApplicationSettingsCB>();
     expectErrorOnlyDelivery<Zel_SetUserSettingsRes, Zel_SetUserSettingsCB>();
-}
-
-TEST(Zel_GenericResTest, SettingsTextResultsHandOverTheTextUnchanged)
-{
     expectTextDelivery<Zel_GetApplicationSettingsRes, Zel_GetApplicationSettingsCB>();
     expectTextDelivery<Zel_SettingsRes, Zel_SettingsCB>();
 }
@@ -201,76 +148,59 @@ TEST(Zel_GenericResTest, SettingsTextResultsHandOverTheTextUnchanged)
 TEST(Zel_GenericResTest, ReservationsAndUserSettingsHandOverEveryPayloadValueInOrder)
 {
     CallLog log;
-    auto reservations = boost::make_shared<GetReservationsCB>(log);
-    Zel_GetReservationsRes reservationsRes(reservations, true);
-    const QDateTime when(QDate(2021, 3, 4), QTime(5, 6, 7), Qt::UTC);
-    reservationsRes.setResult(QStringLiteral("held by ann"), when, success(log, "ok"));
-    EXPECT_FALSE(reservationsRes.deliverNext());
+    Zel_GetReservationsRes reservations(boost::make_shared<GetReservationsCB>(log), true);
+    reservations.setResult(QStringLiteral("held by ann"), QDateTime(QDate(2021, 3, 4), QTime(5, 6, 7), Qt::UTC), ok());
+    EXPECT_EQ(deliverAll(reservations), "F");
     EXPECT_EQ(log.calls, (Calls{"succeeded(held by ann,2021-03-04T05:06:07Z)", "finished()"}));
 
     // The settings type is passed through unchanged, named or not.
     CallLog userLog;
-    auto user = boost::make_shared<GetUserSettingsCB>(userLog);
-    Zel_GetUserSettingsRes userRes(user, false);
-    userRes.setResult(Zel_GetUserSettingsCB::UserSettingsProject, QStringLiteral("a"), success(userLog, "ok"));
-    userRes.setResult(static_cast<Zel_GetUserSettingsCB::UserSettingsType>(-77), QStringLiteral("b"),
-                      success(userLog, "ok2"));
-    userRes.setResult(Zel_GetUserSettingsCB::UserSettingsGeneral, QStringLiteral("c"), failure(userLog, "e3"));
-    EXPECT_TRUE(userRes.deliverNext());
-    EXPECT_TRUE(userRes.deliverNext());
-    EXPECT_FALSE(userRes.deliverNext());
+    Zel_GetUserSettingsRes user(boost::make_shared<GetUserSettingsCB>(userLog), false);
+    user.setResult(Zel_GetUserSettingsCB::UserSettingsProject, QStringLiteral("a"), ok());
+    user.setResult(static_cast<Zel_GetUserSettingsCB::UserSettingsType>(-77), QStringLiteral("b"), ok());
+    user.setResult(Zel_GetUserSettingsCB::UserSettingsGeneral, QStringLiteral("c"), userLog.error("e3"));
+    EXPECT_EQ(deliverAll(user), "TTF");
     EXPECT_EQ(userLog.calls, (Calls{"succeeded(1,a)", "succeeded(-77,b)", "failed(e3)"}));
     static_assert(sizeof(Zel_GetUserSettingsCB::UserSettingsType) == 4, "a 32-bit value");
 }
 
-TEST(Zel_GenericResTest, AssociationsHandOverTheDirectoryAndKeepItemsBeforeCallback)
+TEST(Zel_GenericResTest, AssociationsAndPermissionsHandOverTheirObjectAndKeepTheirFieldOrder)
 {
     CallLog log;
-    auto callback = boost::make_shared<AssociationsCB>(log);
-    LayoutAssociationsRes result(callback, true);
-    auto directory = log.named(boost::make_shared<Zel_Directory>(QStringLiteral("/a/b"), QStringLiteral("/")), "d1");
-    result.setResult(directory, success(log, "ok"));
-    result.setResult(boost::shared_ptr<Zel_Directory>(), failure(log, "e2"));
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
+    Layout<Zel_AssociationsRes> associations(boost::make_shared<AssociationsCB>(log), true);
+    associations.setResult(log.named(boost::make_shared<Zel_Directory>(QStringLiteral("/a/b"), QStringLiteral("/")), "d1"),
+                           ok());
+    associations.setResult(boost::shared_ptr<Zel_Directory>(), log.error("e2"));
+    EXPECT_EQ(deliverAll(associations), "TF");
     EXPECT_EQ(log.calls, (Calls{"succeeded(d1)", "failed(e2)", "finished()"}));
-    EXPECT_TRUE(result.itemsAndCursorBeforeCallback());
-    EXPECT_TRUE(LayoutGetNodeRes(boost::shared_ptr<Zel_ResultCB>(), true).callbackBeforeItemsAndCursor());
+    EXPECT_EQ(associations.order(), "items<cursor<callback");
+    EXPECT_EQ(Layout<Zel_GetNodeRes>(boost::shared_ptr<Zel_ResultCB>(), true).order(), "callback<items<cursor");
+
+    // The permissions, not the record, reach the handler; the item keeps the record first.
+    CallLog permissionsLog;
+    Layout<Zel_NodePermissionsRes> permissions(boost::make_shared<NodePermissionsCB>(permissionsLog), true);
+    auto flags = permissionsLog.named(boost::make_shared<Zel_NodePermissions>(), "P");
+    permissions.setResult(flags, ok());
+    EXPECT_EQ(deliverAll(permissions), "F");
+    EXPECT_EQ(permissionsLog.calls, (Calls{"succeeded(P)", "finished()"}));
+    EXPECT_EQ(permissions.order(), "items<cursor<callback");
+    Zel_NodePermissionsRes::ResultItem item(flags, ok());
+    EXPECT_EQ(memberOrder({{&item.mError, "error"}, {&item.mPermissions, "permissions"}}), "error<permissions");
 }
 
-TEST(Zel_GenericResTest, NodePermissionsHandOverThePermissionsNotTheRecord)
+TEST(Zel_GenericResTest, NodeResolutionsHandOverIdentifierThenTextStoredAsTextErrorIdentifier)
 {
     CallLog log;
-    auto callback = boost::make_shared<NodePermissionsCB>(log);
-    LayoutNodePermissionsRes result(callback, true);
-    auto permissions = log.named(boost::make_shared<Zel_NodePermissions>(), "P");
-    result.setResult(permissions, success(log, "record"));
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"succeeded(P)", "finished()"}));
-    EXPECT_TRUE(result.itemsAndCursorBeforeCallback());
-
-    // The item keeps the error record before the permissions.
-    Zel_NodePermissionsRes::ResultItem item(permissions, success(log, "record"));
-    EXPECT_LT(offsetIn(item, &item.mError), offsetIn(item, &item.mPermissions));
-}
-
-TEST(Zel_GenericResTest, NodeResolutionsHandOverIdentifierThenTextInSetResultOrder)
-{
-    CallLog log;
-    auto callback = boost::make_shared<NodeResolutionsCB>(log);
-    Zel_NodeResolutionsRes result(callback, true);
-    auto mobID = log.named(boost::make_shared<Zel_MobID>(QStringLiteral("060a2b34")), "mob");
-    auto label = log.named(boost::make_shared<QString>(QStringLiteral("HD")), "label");
-    result.setResult(mobID, label, success(log, "ok"));
-    result.setResult(mobID, label, failure(log, "e2"));
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
+    Zel_NodeResolutionsRes result(boost::make_shared<NodeResolutionsCB>(log), true);
+    auto mobID = log.mob("mob");
+    auto label = log.text("label");
+    result.setResult(mobID, label, ok());
+    result.setResult(mobID, label, log.error("e2"));
+    EXPECT_EQ(deliverAll(result), "TF");
     EXPECT_EQ(log.calls, (Calls{"succeeded(mob,label)", "failed(e2)", "finished()"}));
 
-    // Stored as text, error, identifier.
-    Zel_NodeResolutionsRes::ResultItem item(mobID, label, success(log, "ok"));
-    EXPECT_LT(offsetIn(item, &item.mText), offsetIn(item, &item.mError));
-    EXPECT_LT(offsetIn(item, &item.mError), offsetIn(item, &item.mMobID));
+    Zel_NodeResolutionsRes::ResultItem item(mobID, label, ok());
+    EXPECT_EQ(memberOrder({{&item.mText, "text"}, {&item.mError, "error"}, {&item.mMobID, "mob"}}), "text<error<mob");
     EXPECT_EQ(item.mMobID, mobID);
     EXPECT_EQ(item.mText, label);
 }
@@ -278,200 +208,159 @@ TEST(Zel_GenericResTest, NodeResolutionsHandOverIdentifierThenTextInSetResultOrd
 TEST(Zel_GenericResTest, MediaResolutionsHandEachCallItsOwnCopyOfTheList)
 {
     CallLog log;
-    auto callback = boost::make_shared<MediaResolutionsCB>(log);
-    InspectableMediaResolutionsRes result(callback, false);
+    InspectableMediaResolutionsRes result(boost::make_shared<MediaResolutionsCB>(log), false);
     Zel_PropertyKeyInfoList list;
-    list.addIfKeyNotInList(keyInfo("HD"));
-    result.setResult(list, success(log, "ok"));
-    result.setResult(list, success(log, "ok2"));
-    const std::string rendered = text(list.toZelString());
+    list.addIfKeyNotInList(Zel_PropertyKeyInfo(QStringLiteral("HD"), QStringLiteral("HD Display"), false, true,
+                                               QStringLiteral("hd"), Zel_PropertyKeyType(2), false, false));
+    result.setResult(list, ok());
+    result.setResult(list, ok());
+    const std::string rendered = list.toZelString().toStdString();
 
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
+    EXPECT_EQ(deliverAll(result), "TF");
     // The first handler emptied its copy; the second call still got the full list.
     EXPECT_EQ(log.calls, (Calls{"succeeded(" + rendered + ")", "succeeded(" + rendered + ")"}));
     ASSERT_EQ(result.items().size(), 2u);
-    EXPECT_EQ(text(result.items()[0].mResolutions.toZelString()), rendered);
+    EXPECT_EQ(result.items()[0].mResolutions.toZelString().toStdString(), rendered);
     EXPECT_FALSE(result.items()[0].mResolutions.findByKey(QStringLiteral("Added")).isValid());
-    // The caller's list is not touched either.
-    EXPECT_EQ(text(list.toZelString()), rendered);
+    EXPECT_EQ(list.toZelString().toStdString(), rendered) << "the caller's list is not touched either";
 }
 
 TEST(Zel_GenericResTest, ChildrenDeliverBothItemKindsAndIgnoreTheUnstoredBool)
 {
     CallLog log;
-    auto callback = boost::make_shared<ChildrenCB>(log);
-    Zel_ChildrenRes result(callback, true);
-    auto n1 = node(log, "n1");
-    auto n2 = node(log, "n2");
-    result.setResult(n1, false, true, success(log, "ok"));
-    result.setResult(n1, true, false, success(log, "ok"));
-    result.setResult(n1, n2, success(log, "ok"));
-    result.setResult(n2, n1, failure(log, "e4"));
-    result.setResult(n2, true, true, failure(log, "e5"));
-
-    for (int call = 0; call < 4; ++call)
-        EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
+    Zel_ChildrenRes result(boost::make_shared<ChildrenCB>(log), true);
+    auto n1 = log.node("n1");
+    auto n2 = log.node("n2");
+    result.setResult(n1, false, true, ok());
+    result.setResult(n1, true, false, ok());
+    result.setResult(n1, n2, ok());
+    result.setResult(n2, n1, log.error("e4"));
+    result.setResult(n2, true, true, log.error("e5"));
+    EXPECT_EQ(deliverAll(result), "TTTTF");
     EXPECT_EQ(log.calls, (Calls{"succeeded(n1,true)", "succeeded(n1,false)", "succeeded(n1,n2)", "failed(n2,e4)",
                                 "failed(n2,e5)", "finished()"}));
 
-    // Item layout and contents: first node, second node, error, kind, flag.
-    Zel_ChildrenRes::ResultItem item(n1, n2, success(log, "ok"), false, true);
-    EXPECT_LT(offsetIn(item, &item.mFirstNode), offsetIn(item, &item.mSecondNode));
-    EXPECT_LT(offsetIn(item, &item.mSecondNode), offsetIn(item, &item.mError));
-    EXPECT_LT(offsetIn(item, &item.mError), offsetIn(item, &item.mNodeAndFlag));
-    EXPECT_LT(offsetIn(item, &item.mNodeAndFlag), offsetIn(item, &item.mFlag));
+    Zel_ChildrenRes::ResultItem item(n1, n2, ok(), false, true);
+    EXPECT_EQ(memberOrder({{&item.mFirstNode, "first"}, {&item.mSecondNode, "second"}, {&item.mError, "error"},
+                           {&item.mNodeAndFlag, "kind"}, {&item.mFlag, "flag"}}),
+              "first<second<error<kind<flag");
 }
 
 TEST(Zel_GenericResTest, DeleteNodeResultDeliversOutcomeAndFinishesInOneCall)
 {
     CallLog log;
-    auto callback = boost::make_shared<ResultBoolCB>(log);
-    Zel_DeleteNodeRes result(callback, true);
-    result.setResult(true, success(log, "ok"));
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"succeeded(true)", "finished()"}));
-
-    CallLog log2;
-    Zel_DeleteNodeRes two(boost::make_shared<ResultBoolCB>(log2), false);
-    two.setResult(false, success(log2, "ok"));
-    two.setResult(true, failure(log2, "e2"));
-    EXPECT_TRUE(two.deliverNext());
-    EXPECT_FALSE(two.deliverNext());
-    EXPECT_EQ(log2.calls, (Calls{"succeeded(false)", "failed(e2)"}));
+    Zel_DeleteNodeRes result(boost::make_shared<ResultBoolCB>(log), true);
+    result.setResult(true, ok());
+    result.setResult(false, log.error("e2"));
+    EXPECT_EQ(deliverAll(result), "TF");
+    EXPECT_EQ(log.calls, (Calls{"succeeded(true)", "failed(e2)", "finished()"}));
 }
 
-TEST(Zel_GenericResTest, EmptyResultsFinishOnlyWhenFinalAndRepeatTheEndNotice)
+TEST(Zel_ResTest, EmptyResultsFinishOnlyWhenFinalAndRepeatTheEndNotice)
 {
     CallLog log;
     Zel_GetNodeRes finalRes(boost::make_shared<NodeCB<Zel_ResultCB>>(log), true);
-    EXPECT_FALSE(finalRes.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"finished()"}));
-    EXPECT_FALSE(finalRes.deliverNext());
+    EXPECT_EQ(deliverAll(finalRes), "F");
+    EXPECT_EQ(deliverAll(finalRes), "F");
     EXPECT_EQ(log.calls, (Calls{"finished()", "finished()"}));
 
-    CallLog log2;
-    Zel_GetNodeRes partial(boost::make_shared<NodeCB<Zel_ResultCB>>(log2), false);
-    EXPECT_FALSE(partial.deliverNext());
-    EXPECT_TRUE(log2.calls.empty());
+    CallLog partialLog;
+    Zel_GetNodeRes partial(boost::make_shared<NodeCB<Zel_ResultCB>>(partialLog), false);
+    EXPECT_EQ(deliverAll(partial), "F");
+    EXPECT_TRUE(partialLog.calls.empty());
 }
 
-TEST(Zel_GenericResTest, HandlerExceptionsAtFirstMiddleAndLastItemLoseNothing)
+TEST(Zel_ResTest, HandlerExceptionsAtFirstMiddleLastItemAndEndNoticeLoseNothing)
 {
-    for (std::size_t throwingCall : {1u, 2u, 3u}) {
+    for (std::size_t throwingCall : {1u, 2u, 3u, 4u}) {
         for (bool foreign : {false, true}) {
             SCOPED_TRACE(testing::Message() << "throwing call " << throwingCall << (foreign ? " (int)" : ""));
             CallLog log;
             log.throwAt(throwingCall, foreign);
             Zel_GetNodeRes result(boost::make_shared<NodeCB<Zel_ResultCB>>(log), true);
-            result.setResult(node(log, "n1"), success(log, "ok"));
-            result.setResult(node(log, "n2"), failure(log, "e2"));
-            result.setResult(node(log, "n3"), success(log, "ok"));
-            EXPECT_TRUE(result.deliverNext());
-            EXPECT_TRUE(result.deliverNext());
-            EXPECT_FALSE(result.deliverNext());
+            result.setResult(log.node("n1"), ok());
+            result.setResult(log.node("n2"), log.error("e2"));
+            result.setResult(log.node("n3"), ok());
+            EXPECT_EQ(deliverAll(result), "TTF");
             EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "failed(e2)", "succeeded(n3)", "finished()"}));
         }
     }
-
-    // An exception from finished() itself is discarded too.
-    CallLog log;
-    log.throwAt(2);
-    Zel_SettingsRes result(boost::make_shared<TextCB<Zel_SettingsCB>>(log), true);
-    result.setResult(QStringLiteral("x"), success(log, "ok"));
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"succeeded(x)", "finished()"}));
 }
 
-TEST(Zel_GenericResTest, EmptyCallbackConsumesItemsAndNullErrorMeansNoError)
+TEST(Zel_ResTest, EmptyCallbackConsumesItemsAndNullErrorMeansNoError)
 {
     // No callback: nothing is called, yet delivery comes to an end.
     Zel_GetNodeRes orphan(boost::shared_ptr<Zel_ResultCB>(), true);
-    orphan.setResult(boost::make_shared<Zel_Node>(), boost::make_shared<Zel_Error>());
+    orphan.setResult(boost::make_shared<Zel_Node>(), ok());
     orphan.setResult(boost::make_shared<Zel_Node>(), boost::make_shared<Zel_Error>(3, QString()));
-    EXPECT_TRUE(orphan.deliverNext());
-    EXPECT_FALSE(orphan.deliverNext());
+    EXPECT_EQ(deliverAll(orphan), "TF");
     EXPECT_FALSE(orphan.deliverNext());
     EXPECT_FALSE(orphan.haveResults());
-
     Zel_ChildrenRes orphanChildren(boost::shared_ptr<Zel_ChildrenCB>(), false);
-    orphanChildren.setResult(boost::shared_ptr<Zel_Node>(), false, true, boost::shared_ptr<Zel_Error>());
-    EXPECT_FALSE(orphanChildren.deliverNext());
+    orphanChildren.setResult(NodeSP(), false, true, ErrorSP());
+    EXPECT_EQ(deliverAll(orphanChildren), "F");
 
     // An empty error pointer is a success and is never read through.
     CallLog log;
     Zel_GetNodeRes result(boost::make_shared<NodeCB<Zel_ResultCB>>(log), true);
-    result.setResult(node(log, "n1"), boost::shared_ptr<Zel_Error>());
+    result.setResult(log.node("n1"), ErrorSP());
     EXPECT_FALSE(result.isCurrentResultError());
-    EXPECT_FALSE(result.deliverNext());
-    EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "finished()"}));
-
-    CallLog childLog;
-    Zel_ChildrenRes children(boost::make_shared<ChildrenCB>(childLog), false);
-    children.setResult(node(childLog, "a"), node(childLog, "b"), boost::shared_ptr<Zel_Error>());
-    EXPECT_FALSE(children.deliverNext());
-    EXPECT_EQ(childLog.calls, (Calls{"succeeded(a,b)"}));
-
-    CallLog voidLog;
-    Zel_CreateReservationRes reservation(boost::make_shared<VoidCB<Zel_CreateReservationCB>>(voidLog), false);
-    reservation.setResult(boost::shared_ptr<Zel_Error>());
-    EXPECT_FALSE(reservation.deliverNext());
-    EXPECT_EQ(voidLog.calls, (Calls{"succeeded()"}));
+    Zel_ChildrenRes children(boost::make_shared<ChildrenCB>(log), false);
+    children.setResult(log.node("a"), log.node("b"), ErrorSP());
+    Zel_CreateReservationRes reservation(boost::make_shared<VoidCB<Zel_CreateReservationCB>>(log), false);
+    reservation.setResult(ErrorSP());
+    EXPECT_EQ(deliverAll(result), "F");
+    EXPECT_EQ(deliverAll(children), "F");
+    EXPECT_EQ(deliverAll(reservation), "F");
+    EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "finished()", "succeeded(a,b)", "succeeded()"}));
 }
 
-TEST(Zel_GenericResTest, CopySharesCallbackAndPayloadButKeepsItsOwnCursor)
+TEST(Zel_ResTest, CopySharesCallbackAndPayloadKeepsItsOwnCursorAndReleasesTheCallbackLast)
 {
     CallLog log;
     auto callback = boost::make_shared<NodeCB<Zel_ResultCB>>(log);
     boost::weak_ptr<Zel_ResultCB> watch = callback;
     auto original = boost::make_shared<Zel_GetNodeRes>(callback, true);
     callback.reset();
-    original->setResult(node(log, "n1"), success(log, "ok"));
-    original->setResult(node(log, "n2"), success(log, "ok"));
+    original->setResult(log.node("n1"), ok());
+    original->setResult(log.node("n2"), ok());
     EXPECT_TRUE(original->deliverNext());
 
-    Zel_GetNodeRes copy(*original);
+    auto copy = boost::make_shared<Zel_GetNodeRes>(*original);
     EXPECT_FALSE(original->deliverNext());
-    EXPECT_FALSE(copy.deliverNext()) << "the copy starts at the original's cursor";
+    EXPECT_FALSE(copy->deliverNext()) << "the copy starts at the original's cursor";
     EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "succeeded(n2)", "finished()", "succeeded(n2)", "finished()"}));
 
     // Assignment takes over items and cursor; the callback lives while a result holds it.
     Zel_GetNodeRes assigned(boost::shared_ptr<Zel_ResultCB>(), false);
-    assigned = copy;
+    assigned = *copy;
     EXPECT_TRUE(assigned.isFinalResult());
     EXPECT_FALSE(assigned.haveResults());
     original.reset();
+    copy.reset();
     EXPECT_FALSE(watch.expired());
+    assigned = Zel_GetNodeRes(boost::shared_ptr<Zel_ResultCB>(), false);
+    EXPECT_TRUE(watch.expired());
 }
 
 namespace {
 
 // A backend-style request whose work answers with two nodes.
-class TwoNodesReq : public Zel_GetNodeReq
-{
-public:
-    TwoNodesReq(boost::shared_ptr<Zel_ResultCB> callback, boost::shared_ptr<Zel_Node> first,
-                boost::shared_ptr<Zel_Node> second)
-        : Zel_GetNodeReq(callback)
-        , mCallback(std::move(callback))
-        , mFirst(std::move(first))
-        , mSecond(std::move(second))
+struct TwoNodesReq : Zel_GetNodeReq {
+    TwoNodesReq(boost::shared_ptr<Zel_ResultCB> callback, NodeSP first, NodeSP second)
+        : Zel_GetNodeReq(callback), mCallback(callback), mFirst(first), mSecond(second)
     {
     }
     bool doProcess(boost::shared_ptr<Orv_Result>& result) override
     {
         auto res = boost::make_shared<Zel_GetNodeRes>(mCallback, true);
-        res->setResult(mFirst, boost::make_shared<Zel_Error>());
+        res->setResult(mFirst, ok());
         res->setResult(mSecond, boost::make_shared<Zel_Error>(12, QStringLiteral("gone")));
         result = res;
         return true;
     }
-
-private:
     boost::shared_ptr<Zel_ResultCB> mCallback;
-    boost::shared_ptr<Zel_Node> mFirst;
-    boost::shared_ptr<Zel_Node> mSecond;
+    NodeSP mFirst, mSecond;
 };
 
 } // namespace
@@ -479,12 +368,9 @@ private:
 TEST(Zel_GenericResTest, EngineDeliversAGetNodeResultToTheApplicationCallback)
 {
     CallLog log;
-    auto callback = boost::make_shared<NodeCB<Zel_ResultCB>>(log);
     Orv_Engine engine;
-    engine.Submit(boost::make_shared<TwoNodesReq>(callback, node(log, "n1"), node(log, "n2")));
+    engine.Submit(boost::make_shared<TwoNodesReq>(boost::make_shared<NodeCB<Zel_ResultCB>>(log), log.node("n1"),
+                                                  log.node("n2")));
     engine.DeliverAll();
-    ASSERT_EQ(log.calls.size(), 3u);
-    EXPECT_EQ(log.calls[0], "succeeded(n1)");
-    EXPECT_EQ(log.calls[1], "failed(anon)");
-    EXPECT_EQ(log.calls[2], "finished()");
+    EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "failed(anon)", "finished()"}));
 }

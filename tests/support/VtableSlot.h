@@ -9,6 +9,8 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
+#include <initializer_list>
+#include <string>
 
 template <typename MemberFunction>
 std::ptrdiff_t vtableSlot(MemberFunction function)
@@ -19,6 +21,27 @@ std::ptrdiff_t vtableSlot(MemberFunction function)
     if ((representation[0] & 1u) == 0)
         return -1; // not virtual
     return static_cast<std::ptrdiff_t>((representation[0] - 1) / sizeof(void*));
+}
+
+// One row of a slot table: the member's name (for the failure text) and its slot.
+struct SlotRow
+{
+    const char* name;
+    std::ptrdiff_t slot;
+};
+#define ZEL_SLOT_ROW(Class, member) SlotRow{#member, vtableSlot(&Class::member)}
+
+// The rows whose slots do not run first, first + 1, ... in table order, as
+// "name=slot (want n)" words; empty when every row is in its place.
+inline std::string slotsOutOfOrder(std::ptrdiff_t first, std::initializer_list<SlotRow> rows)
+{
+    std::string wrong;
+    for (const SlotRow& row : rows) {
+        if (row.slot != first)
+            wrong += std::string(row.name) + "=" + std::to_string(row.slot) + " (want " + std::to_string(first) + ") ";
+        ++first;
+    }
+    return wrong;
 }
 
 #endif
