@@ -1,0 +1,254 @@
+// Node ordering: std::sort of 10,000 nodes with Zel_Node::operator<, against
+// sorting the same (mime type rank, name) pairs with plain QString comparisons.
+//
+// The nodes look like a large folder listing: mostly master clips, then
+// sequences, subclips, bins, folders and a few other types; names such as
+// "Interview 0042", "b-roll Take 7", "Café Scene 12 Shot 3" in mixed case,
+// with exact duplicates (told apart by moniker). The "mixed" set replaces
+// about one name in ten by a non-Latin-1 one (Cyrillic, Greek, Polish,
+// Japanese), which takes the slower toLower() path of the comparison.
+//
+// Rows (per set: latin1, mixed):
+//   order/<set>/Zel_Node-operator</10000     std::sort(nodes, *a < *b), nodes behind
+//                                            boost::shared_ptr<Zel_Node>
+//   order/<set>/toLower-per-compare/10000    peer: sort of (rank, name) pairs comparing
+//                                            a.name.toLower() < b.name.toLower()
+//   order/<set>/prelowered-keys/10000        floor: sort of (rank, lowered name) pairs,
+//                                            lowered once before the sort
+//   order/<set>/getters+plain-compare/10000  floor of the node interface: the same nodes
+//                                            sorted by getMimeType() then getName() with
+//                                            plain QString <, i.e. the four virtual calls
+//                                            and QString copies every comparison must make
+#include "BenchSupport.h"
+
+#include "Zel_MimeTypeSpec.h"
+#include "Zel_Node.h"
+
+#include <QString>
+#include <QStringList>
+#include <boost/make_shared.hpp>
+#include <boost/shared_ptr.hpp>
+
+#include <algorithm>
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+#include <vector>
+
+namespace {
+
+const int kNodes = 10000;
+
+// A backend's node in its simplest form: name and mime type held in memory.
+class ListedNode : public Zel_Node
+{
+public:
+    ListedNode(const QString& moniker, const QString& name, const QString& mimeType)
+        : mName(name)
+        , mMimeType(mimeType)
+    {
+        setMoniker(moniker);
+    }
+
+    QString getName() override { return mName; }
+    QString getMimeType() override { return mMimeType; }
+
+private:
+    QString mName;
+    QString mMimeType;
+};
+
+// A small deterministic generator, so that every run sorts the same input.
+class Random
+{
+public:
+    explicit Random(std::uint32_t seed)
+        : mState(seed)
+    {
+    }
+    std::uint32_t next()
+    {
+        mState = mState * 1664525u + 1013904223u;
+        return mState >> 8;
+    }
+    int below(int bound) { return static_cast<int>(next() % static_cast<std::uint32_t>(bound)); }
+
+private:
+    std::uint32_t mState;
+};
+
+struct Listing
+{
+    std::vector<boost::shared_ptr<Zel_Node>> nodes;
+    std::vector<QString> names;
+    std::vector<long> ranks;
+};
+
+QString mimeTypeFor(Random& random)
+{
+    const int roll = random.below(100);
+    if (roll < 50)
+        return QStringLiteral("masterclip");
+    if (roll < 55)
+        return QStringLiteral("clip"); // same rank as masterclip
+    if (roll < 70)
+        return QStringLiteral("sequence");
+    if (roll < 80)
+        return QStringLiteral("subclip");
+    if (roll < 88)
+        return QStringLiteral("bin");
+    if (roll < 94)
+        return QStringLiteral("folder");
+    if (roll < 97)
+        return QStringLiteral("effect");
+    return QStringLiteral("Asset");
+}
+
+QString latin1NameFor(Random& random)
+{
+    static const char* const stems[] = {
+        "Interview", "interview", "INTERVIEW", "B-Roll Take", "b-roll take", "Scene", "scene",
+        "Caf\xc3\xa9 Scene", "CAF\xc3\x89 SCENE", "\xc3\x9c" "ber Shot", "\xc3\xbc" "ber shot",
+        "Se\xc3\xb1or Wide", "Archive", "archive", "\xc3\x89lan Final", "Promo", "Titles",
+    };
+    const int stem = random.below(static_cast<int>(sizeof stems / sizeof stems[0]));
+    const QString base = QString::fromUtf8(stems[stem]);
+    if (random.below(3) == 0)
+        return QStringLiteral("%1 %2 Shot %3").arg(base).arg(random.below(60)).arg(random.below(12));
+    return QStringLiteral("%1 %2").arg(base).arg(random.below(2000), 4, 10, QLatin1Char('0'));
+}
+
+QString otherNameFor(Random& random)
+{
+    static const char* const stems[] = {
+        "\xd0\x98\xd0\xbd\xd1\x82\xd0\xb5\xd1\x80\xd0\xb2\xd1\x8c\xd1\x8e", // Интервью
+        "\xd0\xb8\xd0\xbd\xd1\x82\xd0\xb5\xd1\x80\xd0\xb2\xd1\x8c\xd1\x8e", // интервью
+        "\xce\xa3\xce\xba\xce\xb7\xce\xbd\xce\xae",                         // Σκηνή
+        "\xc5\x81\xc3\xb3\x64\xc5\xba Plan",                                 // Łódź Plan
+        "\xe5\xa0\xb4\xe9\x9d\xa2",                                          // 場面
+    };
+    const int stem = random.below(static_cast<int>(sizeof stems / sizeof stems[0]));
+    return QStringLiteral("%1 %2").arg(QString::fromUtf8(stems[stem])).arg(random.below(2000), 4, 10, QLatin1Char('0'));
+}
+
+Listing makeListing(bool withNonLatin1)
+{
+    Random random(withNonLatin1 ? 20240611u : 19700101u);
+    Listing listing;
+    for (int i = 0; i < kNodes; ++i) {
+        const QString mimeType = mimeTypeFor(random);
+        const QString name = withNonLatin1 && random.below(10) == 0 ? otherNameFor(random) : latin1NameFor(random);
+        listing.nodes.push_back(boost::make_shared<ListedNode>(
+            QStringLiteral("zel://server/asset/%1").arg(i), name, mimeType));
+        listing.names.push_back(name);
+        listing.ranks.push_back(Zel_MimeTypeSpec::getSortOrder(mimeType));
+    }
+    return listing;
+}
+
+struct RankedName
+{
+    long rank;
+    QString name;
+};
+
+std::vector<RankedName> rankedNames(const Listing& listing, bool lowered)
+{
+    std::vector<RankedName> entries;
+    for (std::size_t i = 0; i < listing.names.size(); ++i)
+        entries.push_back(RankedName{listing.ranks[i], lowered ? listing.names[i].toLower() : listing.names[i]});
+    return entries;
+}
+
+void check(bool condition, const char* what)
+{
+    if (!condition) {
+        std::fprintf(stderr, "bench_node_order: %s\n", what);
+        std::exit(2);
+    }
+}
+
+void registerRows(const char* set, bool withNonLatin1)
+{
+    const std::string stem = std::string("order/") + set + "/";
+    const std::string size = "/" + std::to_string(kNodes);
+    const std::string feature = stem + "Zel_Node-operator<" + size;
+    const std::string peer = stem + "toLower-per-compare" + size;
+    const std::string floor = stem + "prelowered-keys" + size;
+    const std::string gettersFloor = stem + "getters+plain-compare" + size;
+
+    zelbench::row(feature, kNodes, [withNonLatin1](benchmark::State& state) {
+        const Listing listing = makeListing(withNonLatin1);
+        std::vector<boost::shared_ptr<Zel_Node>> nodes;
+        for (auto _ : state) {
+            state.PauseTiming();
+            nodes = listing.nodes;
+            state.ResumeTiming();
+            std::sort(nodes.begin(), nodes.end(),
+                      [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+        }
+        // The order agrees with the peer's on rank and lowered name.
+        for (std::size_t i = 1; i < nodes.size(); ++i) {
+            const long rankA = Zel_MimeTypeSpec::getSortOrder(nodes[i - 1]->getMimeType());
+            const long rankB = Zel_MimeTypeSpec::getSortOrder(nodes[i]->getMimeType());
+            check(rankA < rankB || (rankA == rankB && nodes[i - 1]->getName().toLower() <= nodes[i]->getName().toLower()),
+                  "nodes out of order");
+        }
+    });
+    zelbench::row(peer, kNodes, [withNonLatin1](benchmark::State& state) {
+        const std::vector<RankedName> unsorted = rankedNames(makeListing(withNonLatin1), false);
+        std::vector<RankedName> entries;
+        for (auto _ : state) {
+            state.PauseTiming();
+            entries = unsorted;
+            state.ResumeTiming();
+            std::sort(entries.begin(), entries.end(), [](const RankedName& a, const RankedName& b) {
+                if (a.rank != b.rank)
+                    return a.rank < b.rank;
+                return a.name.toLower() < b.name.toLower();
+            });
+        }
+    });
+    zelbench::row(floor, kNodes, [withNonLatin1](benchmark::State& state) {
+        const std::vector<RankedName> unsorted = rankedNames(makeListing(withNonLatin1), true);
+        std::vector<RankedName> entries;
+        for (auto _ : state) {
+            state.PauseTiming();
+            entries = unsorted;
+            state.ResumeTiming();
+            std::sort(entries.begin(), entries.end(), [](const RankedName& a, const RankedName& b) {
+                if (a.rank != b.rank)
+                    return a.rank < b.rank;
+                return a.name < b.name;
+            });
+        }
+    });
+    zelbench::row(gettersFloor, kNodes, [withNonLatin1](benchmark::State& state) {
+        const Listing listing = makeListing(withNonLatin1);
+        std::vector<boost::shared_ptr<Zel_Node>> nodes;
+        for (auto _ : state) {
+            state.PauseTiming();
+            nodes = listing.nodes;
+            state.ResumeTiming();
+            std::sort(nodes.begin(), nodes.end(), [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) {
+                const QString mimeA = a->getMimeType();
+                const QString mimeB = b->getMimeType();
+                if (mimeA != mimeB)
+                    return mimeA < mimeB;
+                return a->getName() < b->getName();
+            });
+        }
+    });
+    zelbench::compare(feature, peer, "peer");
+    zelbench::compare(feature, floor, "floor");
+    zelbench::compare(feature, gettersFloor, "floor");
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    registerRows("latin1", false);
+    registerRows("mixed", true);
+    return zelbench::runMain(argc, argv, "node order");
+}
