@@ -119,6 +119,20 @@ private:
     std::set<std::size_t> mThrowForeign;
 };
 
+// Calls deliverNext() until it answers false (at most 20 times); the answers, e.g. "TTF".
+template <class Res>
+std::string deliverAll(Res& result)
+{
+    std::string answers;
+    for (int i = 0; i < 20; ++i) {
+        const bool more = result.deliverNext();
+        answers += more ? 'T' : 'F';
+        if (!more)
+            break;
+    }
+    return answers;
+}
+
 // A success record (code -1).
 inline ErrorSP ok()
 {

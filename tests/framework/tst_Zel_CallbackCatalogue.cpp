@@ -1,6 +1,5 @@
-// The callback catalogue: handler slot order of every callback, the setter
-// slots of the results, and the callbacks with fields of their own. (Each
-// result header brings in the callback it answers.)
+// The callback catalogue: handler slot order of every callback and the setter
+// slots of the results. (Each result header brings in the callback it answers.)
 #include "VtableSlot.h"
 
 #include "Zel_AddDependencyRes.h"
@@ -47,7 +46,6 @@
 #include "Zel_NodeResolutionsRes.h"
 #include "Zel_PropertyListCB.h"
 #include "Zel_QueryCB.h"
-#include "Zel_QuerySpec.h"
 #include "Zel_RefreshNodeCB.h"
 #include "Zel_RemoveReservationRes.h"
 #include "Zel_RenameNodeCB.h"
@@ -61,7 +59,6 @@
 #include "Zel_SettingsRes.h"
 #include "Zel_StartupRes.h"
 
-#include <boost/make_shared.hpp>
 #include <gtest/gtest.h>
 
 #include <type_traits>
@@ -167,9 +164,11 @@ TEST(Zel_CallbackCatalogueTest, CallbacksAnsweredByBackendResultsHaveTheirSlotCo
 
     // Two slots.
     EXPECT_EQ(slotsOutOfOrder(kFirstHandler, {ZEL_SLOT_ROW(Zel_LoginCB, succeeded), ZEL_SLOT_ROW(Zel_LoginCB, failed)}), "");
-    EXPECT_EQ(slotsOutOfOrder(kFirstHandler, {ZEL_SLOT_ROW(Zel_LoginBriefCB, succeeded), ZEL_SLOT_ROW(Zel_LoginBriefCB, failed)}),
+    EXPECT_EQ(slotsOutOfOrder(kFirstHandler,
+                              {ZEL_SLOT_ROW(Zel_LoginBriefCB, succeeded), ZEL_SLOT_ROW(Zel_LoginBriefCB, failed)}),
               "");
-    EXPECT_EQ(slotsOutOfOrder(kFirstHandler, {ZEL_SLOT_ROW(Zel_RootNodeCB, succeeded), ZEL_SLOT_ROW(Zel_RootNodeCB, failed)}), "");
+    EXPECT_EQ(slotsOutOfOrder(kFirstHandler, {ZEL_SLOT_ROW(Zel_RootNodeCB, succeeded), ZEL_SLOT_ROW(Zel_RootNodeCB, failed)}),
+              "");
 }
 
 TEST(Zel_CallbackCatalogueTest, ResultsKeepTheirFillingSlotsAfterTheDeliveryOperations)
@@ -186,7 +185,8 @@ TEST(Zel_CallbackCatalogueTest, ResultsKeepTheirFillingSlotsAfterTheDeliveryOper
 
     // The three results on the engine base add one slot after deliverNext.
     EXPECT_EQ(slotsOutOfOrder(4, {ZEL_SLOT_ROW(Zel_CheckinRes, deliverNext), ZEL_SLOT_ROW(Zel_CheckinRes, addItem)}), "");
-    EXPECT_EQ(slotsOutOfOrder(4, {ZEL_SLOT_ROW(Zel_CheckinUpdateRes, deliverNext), ZEL_SLOT_ROW(Zel_CheckinUpdateRes, addItem)}),
+    EXPECT_EQ(slotsOutOfOrder(4, {ZEL_SLOT_ROW(Zel_CheckinUpdateRes, deliverNext),
+                                  ZEL_SLOT_ROW(Zel_CheckinUpdateRes, addItem)}),
               "");
     EXPECT_EQ(slotsOutOfOrder(4, {ZEL_SLOT_ROW(Zel_StartupRes, deliverNext), ZEL_SLOT_ROW(Zel_StartupRes, setError)}), "");
     EXPECT_FALSE((std::is_base_of<Zel_Res, Zel_CheckinRes>::value));
@@ -206,47 +206,4 @@ TEST(Zel_CallbackCatalogueTest, ResultsKeepTheirFillingSlotsAfterTheDeliveryOper
     EXPECT_EQ(vtableSlot(&Zel_DeleteRes::ResultItem::deliver), 2);
     EXPECT_EQ(vtableSlot(&Zel_DeleteRes::LocalDeleteMobNotFoundErrorPartialResultItem::deliver), 2);
     EXPECT_TRUE((std::is_base_of<Zel_DeleteRes::ResultItem, Zel_DeleteRes::RemoteMediaDeleteErrorPartialResultItem>::value));
-}
-
-namespace {
-
-struct QueryCB : Zel_QueryCB {
-    void succeeded(NodeSP) override {}
-    void failed(ErrorSP) override {}
-    void finished() override {}
-    void setQuerySpec(boost::shared_ptr<Zel_QuerySpec> querySpec) override
-    {
-        ++setCount;
-        Zel_QueryCB::setQuerySpec(std::move(querySpec));
-    }
-    int setCount = 0;
-};
-
-struct ChildrenAtMonikerCB : Zel_ChildrenAtMonikerCB {
-    void succeeded(NodeSP) override {}
-    void failed(ErrorSP) override {}
-    void finished() override {}
-};
-
-} // namespace
-
-TEST(Zel_CallbackCatalogueTest, ChildrenAtMonikerAndQueryCallbacksShareWhatTheyAreGiven)
-{
-    ChildrenAtMonikerCB callback;
-    EXPECT_FALSE(callback.getParentNode() || callback.getParentMoniker());
-    auto parent = boost::make_shared<Zel_Node>(QStringLiteral("p"));
-    callback.setParentNode(parent);
-    callback.setParentMoniker(boost::make_shared<QString>(QStringLiteral("m")));
-    const ChildrenAtMonikerCB copy(callback);
-    EXPECT_EQ(copy.getParentNode(), parent);
-    EXPECT_EQ(copy.getParentMoniker(), callback.getParentMoniker());
-    EXPECT_EQ(parent.use_count(), 3);
-
-    auto query = boost::make_shared<QueryCB>();
-    EXPECT_FALSE(query->getQuerySpec());
-    auto spec = boost::make_shared<Zel_QuerySpec>();
-    boost::shared_ptr<Zel_QueryCB> asBase = query;
-    asBase->setQuerySpec(spec);
-    EXPECT_EQ(query->setCount, 1) << "setQuerySpec is virtual";
-    EXPECT_EQ(QueryCB(*query).getQuerySpec(), spec);
 }

@@ -43,9 +43,7 @@ TEST(Zel_CheckinResTest, DeliversEachOutcomeAndFinishesAfterTheLastOfAFinalResul
         CallLog log;
         Zel_CheckinRes result(boost::make_shared<CheckinCB>(log), finalResult);
         fillCheckin(result, log);
-        EXPECT_TRUE(result.deliverNext());
-        EXPECT_TRUE(result.deliverNext());
-        EXPECT_FALSE(result.deliverNext());
+        EXPECT_EQ(deliverAll(result), "TTF");
         Calls expected = kCheckinCalls;
         if (finalResult)
             expected.push_back("finished()");
@@ -72,9 +70,7 @@ TEST(Zel_CheckinResTest, HandlerExceptionsAtFirstMiddleAndLastItemLoseNothing)
             Zel_CheckinRes result(boost::make_shared<CheckinCB>(log), true);
             fillCheckin(result, log);
             // Answers as if the handler had returned; call 4 is finished().
-            EXPECT_TRUE(result.deliverNext());
-            EXPECT_TRUE(result.deliverNext());
-            EXPECT_FALSE(result.deliverNext());
+            EXPECT_EQ(deliverAll(result), "TTF");
             Calls expected = kCheckinCalls;
             expected.push_back("finished()");
             EXPECT_EQ(log.calls, expected);
@@ -100,8 +96,7 @@ TEST(Zel_CheckinResTest, NoCallbackDeliversNothingNullErrorMeansSuccessAndCopies
     fillCheckin(source, copyLog);
     EXPECT_TRUE(source.deliverNext());
     Zel_CheckinRes copy(source);
-    EXPECT_TRUE(copy.deliverNext());
-    EXPECT_FALSE(copy.deliverNext());
+    EXPECT_EQ(deliverAll(copy), "TF");
     EXPECT_EQ(copyLog.calls, (Calls{"succeeded(d1,n1,t1)", "failed(d2,e2)", "succeeded(d3,n3,t3)", "finished()"}));
 }
 
@@ -115,9 +110,7 @@ TEST(Zel_CheckinUpdateResTest, DeliversSuccessesWithoutArgumentsAndSurvivesHandl
         result.addItem(ok());
         result.addItem(log.error("e2"));
         result.addItem(ErrorSP());
-        EXPECT_TRUE(result.deliverNext());
-        EXPECT_TRUE(result.deliverNext());
-        EXPECT_FALSE(result.deliverNext());
+        EXPECT_EQ(deliverAll(result), "TTF");
         EXPECT_EQ(log.calls, (Calls{"succeeded()", "failed(e2)", "succeeded()", "finished()"}));
     }
 
@@ -184,7 +177,6 @@ TEST(Zel_AddDependencyResTest, DeliversNodeAndDependencyListThenFinishesInTheSam
     failLog.throwAt(1);
     failing.setResult(failLog.node("n"), Zel_DependencySPList(), failLog.error("e1"));
     failing.setResult(failLog.node("m"), Zel_DependencySPList(), ok());
-    EXPECT_TRUE(failing.deliverNext());
-    EXPECT_FALSE(failing.deliverNext());
+    EXPECT_EQ(deliverAll(failing), "TF");
     EXPECT_EQ(failLog.calls, (Calls{"failed(e1)", "succeeded(m)"}));
 }

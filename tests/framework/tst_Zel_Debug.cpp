@@ -39,29 +39,26 @@ TEST(Zel_DebugTest, WritesNothingWhileTracingIsOff)
 
 TEST(Zel_DebugTest, FormatsSourceTextAndSecondsExactly)
 {
-    TraceCapture capture;
-    Zel_Debug& debug = *Zel_Debug::instance();
-    debug.debug(QStringLiteral("Zel_GetNodeReq"), QStringLiteral("processed request ID:12)"), 15);
-    debug.debug(QString(), QStringLiteral("only text"), 0);
-    debug.debug(QStringLiteral("OnlySource"), QString(), 0);
-    debug.debug(QString(), QString(), 0);
-    debug.debug(QString(), QString(), 1500);
-    debug.debug(QString(), QString(), -1500);
-    debug.debug(QStringLiteral("S"), QStringLiteral("t"), 1);
-    debug.debug(QStringLiteral("S"), QStringLiteral("t"), 123456789);
-
-    const std::vector<std::string> expected = {
-        "ZEL: Zel_GetNodeReq: processed request ID:12) (0.015 seconds)",
-        "ZEL: only text",
-        "ZEL: OnlySource:",
-        "ZEL:",
-        "ZEL: (1.5 seconds)",
-        "ZEL: (-1.5 seconds)",
-        "ZEL: S: t (0.001 seconds)",
-        "ZEL: S: t (123457 seconds)",
+    struct Row
+    {
+        const char *source, *text;
+        int milliseconds;
+        std::string line;
     };
+    const std::vector<Row> rows = {
+        {"Zel_GetNodeReq", "processed request ID:12)", 15, "ZEL: Zel_GetNodeReq: processed request ID:12) (0.015 seconds)"},
+        {nullptr, "only text", 0, "ZEL: only text"},        {"OnlySource", nullptr, 0, "ZEL: OnlySource:"},
+        {nullptr, nullptr, 0, "ZEL:"},                      {nullptr, nullptr, 1500, "ZEL: (1.5 seconds)"},
+        {nullptr, nullptr, -1500, "ZEL: (-1.5 seconds)"},   {"S", "t", 1, "ZEL: S: t (0.001 seconds)"},
+        {"S", "t", 123456789, "ZEL: S: t (123457 seconds)"},
+    };
+    TraceCapture capture;
+    std::vector<std::string> expected;
+    for (const Row& row : rows) {
+        Zel_Debug::instance()->debug(QString::fromLatin1(row.source), QString::fromLatin1(row.text), row.milliseconds);
+        expected.push_back(row.line);
+    }
     EXPECT_EQ(capture.orvLines(), expected);
-
     const QStringList qtLines = capture.qtLines();
     ASSERT_EQ(qtLines.size(), static_cast<int>(expected.size()));
     for (int i = 0; i < qtLines.size(); ++i)

@@ -40,10 +40,7 @@ TEST(Zel_DeleteResTest, EveryItemKindReachesItsOwnHandlerWithArgumentsInStorageO
 
         EXPECT_TRUE(result.deliverNext());
         EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(" + std::to_string(LONG_MAX) + ")"}));
-        int trueAnswers = 1;
-        while (result.deliverNext())
-            ++trueAnswers;
-        EXPECT_EQ(trueAnswers, 9);
+        EXPECT_EQ(deliverAll(result), "TTTTTTTTF");
         Calls expected{
             "remoteAssetDeleteSuccessTotalResult(" + std::to_string(LONG_MAX) + ")",
             "remoteMetadataDeleteSuccessTotalResult(" + std::to_string(LONG_MIN) + ")",
@@ -78,10 +75,7 @@ TEST(Zel_DeleteResTest, SuccessItemsWithAnErrorRecordStillReachTheirSuccessHandl
     result.setRemoteMediaDeleteSuccessPartialResult(log.mob("m"), log.error("e3"));
     result.setLocalDeleteMediaSuccessPartialResult(log.mob("n"), log.error("e4"));
     EXPECT_TRUE(result.isCurrentResultError()) << "the record still classifies the item";
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
+    EXPECT_EQ(deliverAll(result), "TTTF");
     EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(1)", "remoteMetadataDeleteSuccessTotalResult(2)",
                                 "remoteMediaDeleteSuccessPartialResult(m)", "localDeleteMediaSuccessPartialResult(n)",
                                 "finished()"}));
@@ -100,9 +94,7 @@ TEST(Zel_DeleteResTest, NullErrorRecordsAreStoredAsNoErrorAndNeverReadThrough)
         EXPECT_EQ(item->mError->getCode(), -1);
     }
     EXPECT_FALSE(result.isCurrentResultError());
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_TRUE(result.deliverNext());
-    EXPECT_FALSE(result.deliverNext());
+    EXPECT_EQ(deliverAll(result), "TTF");
     // The handlers receive a real "no error" record, never an empty pointer.
     EXPECT_EQ(log.calls, (Calls{"errorResult(anon)", "remoteMetadataDeleteErrorPartialResult(m,anon)",
                                 "remoteAssetDeleteSuccessTotalResult(4)"}));
@@ -118,9 +110,7 @@ TEST(Zel_DeleteResTest, HandlerExceptionsAndAnEmptyCallbackLoseNoItem)
         result.setErrorResult(log.error("e1"));
         result.setRemoteMediaDeleteSuccessPartialResult(log.mob("m"), ok());
         result.setRemoteAssetDeleteSuccessTotalResult(9, ok());
-        EXPECT_TRUE(result.deliverNext());
-        EXPECT_TRUE(result.deliverNext());
-        EXPECT_FALSE(result.deliverNext());
+        EXPECT_EQ(deliverAll(result), "TTF");
         EXPECT_EQ(log.calls, (Calls{"errorResult(e1)", "remoteMediaDeleteSuccessPartialResult(m)",
                                     "remoteAssetDeleteSuccessTotalResult(9)", "finished()"}));
     }
@@ -128,8 +118,7 @@ TEST(Zel_DeleteResTest, HandlerExceptionsAndAnEmptyCallbackLoseNoItem)
     Zel_DeleteRes orphan(boost::shared_ptr<Zel_DeleteCB>(), true);
     orphan.setErrorResult(boost::make_shared<Zel_Error>(1, QString()));
     orphan.setLocalDeleteMediaSuccessPartialResult(boost::make_shared<Zel_MobID>(), ok());
-    EXPECT_TRUE(orphan.deliverNext());
-    EXPECT_FALSE(orphan.deliverNext());
+    EXPECT_EQ(deliverAll(orphan), "TF");
     EXPECT_FALSE(orphan.haveResults());
 
     // An item handed an empty callback calls nothing.

@@ -38,20 +38,6 @@ using namespace ResultsTest;
 
 namespace {
 
-// Calls deliverNext() until it answers false; the answers, e.g. "TTF".
-template <class Res>
-std::string deliverAll(Res& result)
-{
-    std::string answers;
-    for (int i = 0; i < 20; ++i) {
-        const bool more = result.deliverNext();
-        answers += more ? 'T' : 'F';
-        if (!more)
-            break;
-    }
-    return answers;
-}
-
 // Fills a result of the node family with (n1, ok), (n2, e2), (n3, ok) and
 // checks the whole delivery, final and not final.
 template <class Res, class CB>

@@ -88,27 +88,26 @@ TEST(Zel_ReqTest, TracesStartAndEndAroundWorkAndPushesTheResult)
     EXPECT_EQ(capture.qtLines().size(), 2);
 }
 
-TEST(Zel_ReqTest, RequestNumbersAreDistinctAndIncreasing)
-{
-    ScriptedReq first(QStringLiteral("A"), [](boost::shared_ptr<Orv_Result>&) { return false; });
-    ScriptedReq second(QStringLiteral("B"), [](boost::shared_ptr<Orv_Result>&) { return false; });
-    EXPECT_GT(first.getRequestID().getValue(), 0);
-    EXPECT_GT(second.getRequestID().getValue(), first.getRequestID().getValue());
-}
-
-TEST(Zel_ReqTest, EmptyQueueSkipsWorkButStillTraces)
+TEST(Zel_ReqTest, EmptyQueueSkipsWorkButStillTracesAndAnEmptyNameLeavesTheSourceOut)
 {
     TraceCapture capture;
     ScriptedReq request(QStringLiteral("R"), [](boost::shared_ptr<Orv_Result>&) { return true; });
     EXPECT_FALSE(request.process(boost::shared_ptr<Orv_ResultQ>()));
     EXPECT_EQ(request.mRuns, 0);
-    const std::vector<std::string> lines = capture.orvLines();
-    ASSERT_EQ(lines.size(), 2u);
-    EXPECT_EQ(lines[0], "ZEL: R: processing request" + idText(request));
-    EXPECT_EQ(lines[1], "ZEL: R: processed request" + idText(request));
+    ScriptedReq unnamed(QString(), [](boost::shared_ptr<Orv_Result>&) { return true; });
+    EXPECT_FALSE(unnamed.process(boost::shared_ptr<Orv_ResultQ>()));
+    EXPECT_EQ(capture.orvLines(), (std::vector<std::string>{
+                                      "ZEL: R: processing request" + idText(request),
+                                      "ZEL: R: processed request" + idText(request),
+                                      "ZEL: processing request" + idText(unnamed),
+                                      "ZEL: processed request" + idText(unnamed),
+                                  }));
+    // Request numbers are distinct and increasing.
+    EXPECT_GT(request.getRequestID().getValue(), 0);
+    EXPECT_GT(unnamed.getRequestID().getValue(), request.getRequestID().getValue());
 }
 
-TEST(Zel_ReqTest, WorkWithoutResultPushesNothingAndPassesItsAnswer)
+TEST(Zel_ReqTest, WorkWithoutResultPushesNothingPassesItsAnswerAndRunsAgainOnANewQueue)
 {
     TraceCapture capture(false);
     const boost::shared_ptr<Orv_ResultQ> queue = boost::make_shared<Orv_ResultQ>();
@@ -127,6 +126,14 @@ TEST(Zel_ReqTest, WorkWithoutResultPushesNothingAndPassesItsAnswer)
     EXPECT_EQ(queue->Size(), 1u);
     EXPECT_TRUE(capture.orvLines().empty());
     EXPECT_TRUE(capture.qtLines().isEmpty());
+
+    // Processing again runs the work again, on the new queue.
+    const boost::shared_ptr<Orv_ResultQ> second = boost::make_shared<Orv_ResultQ>();
+    falseWithResult.process(second);
+    EXPECT_EQ(falseWithResult.mRuns, 2);
+    EXPECT_EQ(queue->Size(), 1u);
+    EXPECT_EQ(second->Size(), 1u);
+    EXPECT_EQ(falseWithResult.queue(), second);
 }
 
 TEST(Zel_ReqTest, TracingSwitchedDuringWorkWritesOnlyTheLineOfTheStateAtItsTime)
@@ -140,19 +147,10 @@ TEST(Zel_ReqTest, TracingSwitchedDuringWorkWritesOnlyTheLineOfTheStateAtItsTime)
             return true;
         });
         request.process(boost::make_shared<Orv_ResultQ>());
-        EXPECT_EQ(capture.orvLines(), std::vector<std::string>{onDuringWork ? "ZEL: Toggle: processed request"
-                                                                             : "ZEL: Toggle: processing request" + idText(request)});
+        const std::string expected = onDuringWork ? "ZEL: Toggle: processed request"
+                                                  : "ZEL: Toggle: processing request" + idText(request);
+        EXPECT_EQ(capture.orvLines(), std::vector<std::string>{expected});
     }
-}
-
-TEST(Zel_ReqTest, EmptyNameLeavesSourceOut)
-{
-    TraceCapture capture;
-    ScriptedReq request(QString(), [](boost::shared_ptr<Orv_Result>&) { return true; });
-    EXPECT_TRUE(request.getName().isEmpty());
-    request.process(boost::make_shared<Orv_ResultQ>());
-    ASSERT_EQ(capture.orvLines().size(), 2u);
-    EXPECT_EQ(capture.orvLines()[0], "ZEL: processing request" + idText(request));
 }
 
 TEST(Zel_ReqTest, ExceptionFromWorkPassesThroughAndNothingIsPushed)
@@ -166,22 +164,6 @@ TEST(Zel_ReqTest, ExceptionFromWorkPassesThroughAndNothingIsPushed)
     EXPECT_THROW(request.process(queue), std::runtime_error);
     EXPECT_EQ(queue->Size(), 0u);
     ASSERT_EQ(capture.orvLines().size(), 1u); // the closing line is never reached
-}
-
-TEST(Zel_ReqTest, ProcessingAgainRunsTheWorkAgainOnTheNewQueue)
-{
-    ScriptedReq request(QStringLiteral("Again"), [](boost::shared_ptr<Orv_Result>& result) {
-        result = boost::make_shared<EmptyRes>();
-        return true;
-    });
-    const boost::shared_ptr<Orv_ResultQ> first = boost::make_shared<Orv_ResultQ>();
-    const boost::shared_ptr<Orv_ResultQ> second = boost::make_shared<Orv_ResultQ>();
-    request.process(first);
-    request.process(second);
-    EXPECT_EQ(request.mRuns, 2);
-    EXPECT_EQ(first->Size(), 1u);
-    EXPECT_EQ(second->Size(), 1u);
-    EXPECT_EQ(request.queue(), second);
 }
 
 TEST(Zel_ReqTest, VirtualSlotsInDeclaredOrder)

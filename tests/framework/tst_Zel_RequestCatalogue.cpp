@@ -66,6 +66,8 @@
 #include <gtest/gtest.h>
 
 #include <type_traits>
+#include <utility>
+#include <vector>
 
 namespace {
 
@@ -136,61 +138,35 @@ void expectEngineRequest(const char* literal)
 
 TEST(Zel_RequestCatalogueTest, EveryRequestCarriesItsNameCallbackAndQueue)
 {
-    expectZelRequest<Zel_AddDependencyReq>("Zel_AddDependencyReq");
-    expectZelRequest<Zel_AddFrameLocatorListReq>("Zel_AddFrameLocatorListReq");
-    expectZelRequest<Zel_AddFrameRestrictionListReq>("Zel_AddFrameRestrictionListReq");
-    expectZelRequest<Zel_AnalyzeReq>("Zel_AnalyzeReq");
-    expectZelRequest<Zel_AssociationsReq>("Zel_AssociationsReq");
-    expectZelRequest<Zel_CheckinLocalBinReq>("Zel_CheckinLocalBinReq");
-    expectZelRequest<Zel_CheckinReq>("Zel_CheckinReq");
-    expectZelRequest<Zel_CheckinUpdateReq>("Zel_CheckinUpdateReq");
-    expectZelRequest<Zel_ChildrenAtMonikerReq>("Zel_ChildrenAtMonikerReq");
-    expectZelRequest<Zel_ChildrenAtReq>("Zel_ChildrenAtReq");
-    expectZelRequest<Zel_ChildrenReq>("Zel_ChildrenReq");
-    expectZelRequest<Zel_CopyNodeReq>("Zel_CopyNodeReq");
-    expectZelRequest<Zel_CreateFolderReq>("Zel_CreateFolderReq");
-    expectZelRequest<Zel_CreateFolderUniqueReq>("Zel_CreateFolderUniqueReq");
-    expectZelRequest<Zel_CreateNodeUniqueReq>("Zel_CreateNodeUniqueReq");
-    expectZelRequest<Zel_CreatePropertyReq>("Zel_CreatePropertyReq");
-    expectZelRequest<Zel_CreateReservationReq>("Zel_CreateReservationReq");
-    expectZelRequest<Zel_DeleteFrameLocatorListReq>("Zel_DeleteFrameLocatorListReq");
-    expectZelRequest<Zel_DeleteFrameRestrictionListReq>("Zel_DeleteFrameRestrictionListReq");
-    expectZelRequest<Zel_DeleteNodeReq>("Zel_DeleteNodeReq");
-    expectZelRequest<Zel_DeleteReq>("Zel_DeleteReq");
-    expectZelRequest<Zel_DirReq>("Zel_DirReq");
-    expectZelRequest<Zel_GetApplicationSettingsReq>("Zel_GetApplicationSettingsReq");
-    expectZelRequest<Zel_GetChildrenReq>("Zel_GetChildrenReq");
-    expectZelRequest<Zel_GetFrameLocatorListReq>("Zel_GetFrameLocatorListReq");
-    expectZelRequest<Zel_GetFrameRestrictionListReq>("Zel_GetFrameRestrictionListReq");
-    expectZelRequest<Zel_GetLinkedProjectsReq>("Zel_GetLinkedProjectsReq");
-    expectZelRequest<Zel_GetNodeReq>("Zel_GetNodeReq");
-    expectZelRequest<Zel_GetReservationsReq>("Zel_GetReservationsReq");
-    expectZelRequest<Zel_GetSettingsReq>("Zel_GetSettingsReq");
-    expectZelRequest<Zel_GetSyncedProjRootReq>("Zel_GetSyncedProjRootReq");
-    expectZelRequest<Zel_GetUserPriviledgesReq>("Zel_GetUserPriviledgesReq");
-    expectZelRequest<Zel_GetUserSettingsReq>("Zel_GetUserSettingsReq");
-    expectZelRequest<Zel_GetWorkgroupSettingsReq>("Zel_GetWorkgroupSettingsReq");
-    expectZelRequest<Zel_MediaResolutionsReq>("Zel_MediaResolutionsReq");
-    expectZelRequest<Zel_MobBinaryDnDReq>("Zel_MobBinaryDnDReq");
-    expectZelRequest<Zel_MobBinaryReq>("Zel_MobBinaryReq");
-    expectZelRequest<Zel_MobHeadframeReq>("Zel_MobHeadframeReq");
-    expectZelRequest<Zel_MobNodeReq>("Zel_MobNodeReq");
-    expectZelRequest<Zel_MonikerReq>("Zel_MonikerReq");
-    expectZelRequest<Zel_MoveNodeReq>("Zel_MoveNodeReq");
-    expectZelRequest<Zel_NodePermissionsReq>("Zel_NodePermissionsReq");
-    expectZelRequest<Zel_NodeReq>("Zel_NodeReq");
-    expectZelRequest<Zel_NodeResolutionsReq>("Zel_NodeResolutionsReq");
-    expectZelRequest<Zel_PropertyListReq>("Zel_PropertyListReq");
-    expectZelRequest<Zel_QueryReq>("Zel_Query");
-    expectZelRequest<Zel_RefreshNodeReq>("Zel_RefreshNodeReq");
-    expectZelRequest<Zel_RemoveReservationReq>("Zel_RemoveReservationReq");
-    expectZelRequest<Zel_RenameNodeReq>("Zel_RenameNodeReq");
-    expectZelRequest<Zel_RenameUniqueReq>("Zel_RenameUniqueReq");
-    expectZelRequest<Zel_SaveSettingsReq>("Zel_SaveSettingsReq");
-    expectZelRequest<Zel_SetApplicationSettingsReq>("Zel_SetApplicationSettingsReq");
-    expectZelRequest<Zel_SetPropertiesReq>("Zel_SetPropertiesReq");
-    expectZelRequest<Zel_SetUserSettingsReq>("Zel_SetUserSettingsReq");
-    expectZelRequest<Zel_StartupReq>("Zel_StartupReq");
+    // Each request is named after its class, except the query request.
+#define ZEL_REQ(Class) {#Class, &expectZelRequest<Class>}
+    const std::vector<std::pair<const char*, void (*)(const char*)>> requests = {
+        ZEL_REQ(Zel_AddDependencyReq), ZEL_REQ(Zel_AddFrameLocatorListReq), ZEL_REQ(Zel_AddFrameRestrictionListReq),
+        ZEL_REQ(Zel_AnalyzeReq), ZEL_REQ(Zel_AssociationsReq), ZEL_REQ(Zel_CheckinLocalBinReq),
+        ZEL_REQ(Zel_CheckinReq), ZEL_REQ(Zel_CheckinUpdateReq), ZEL_REQ(Zel_ChildrenAtMonikerReq),
+        ZEL_REQ(Zel_ChildrenAtReq), ZEL_REQ(Zel_ChildrenReq), ZEL_REQ(Zel_CopyNodeReq),
+        ZEL_REQ(Zel_CreateFolderReq), ZEL_REQ(Zel_CreateFolderUniqueReq), ZEL_REQ(Zel_CreateNodeUniqueReq),
+        ZEL_REQ(Zel_CreatePropertyReq), ZEL_REQ(Zel_CreateReservationReq), ZEL_REQ(Zel_DeleteFrameLocatorListReq),
+        ZEL_REQ(Zel_DeleteFrameRestrictionListReq), ZEL_REQ(Zel_DeleteNodeReq), ZEL_REQ(Zel_DeleteReq),
+        ZEL_REQ(Zel_DirReq), ZEL_REQ(Zel_GetApplicationSettingsReq), ZEL_REQ(Zel_GetChildrenReq),
+        ZEL_REQ(Zel_GetFrameLocatorListReq), ZEL_REQ(Zel_GetFrameRestrictionListReq),
+        ZEL_REQ(Zel_GetLinkedProjectsReq), ZEL_REQ(Zel_GetNodeReq), ZEL_REQ(Zel_GetReservationsReq),
+        ZEL_REQ(Zel_GetSettingsReq), ZEL_REQ(Zel_GetSyncedProjRootReq), ZEL_REQ(Zel_GetUserPriviledgesReq),
+        ZEL_REQ(Zel_GetUserSettingsReq), ZEL_REQ(Zel_GetWorkgroupSettingsReq), ZEL_REQ(Zel_MediaResolutionsReq),
+        ZEL_REQ(Zel_MobBinaryDnDReq), ZEL_REQ(Zel_MobBinaryReq), ZEL_REQ(Zel_MobHeadframeReq),
+        ZEL_REQ(Zel_MobNodeReq), ZEL_REQ(Zel_MonikerReq), ZEL_REQ(Zel_MoveNodeReq), ZEL_REQ(Zel_NodePermissionsReq),
+        ZEL_REQ(Zel_NodeReq), ZEL_REQ(Zel_NodeResolutionsReq), ZEL_REQ(Zel_PropertyListReq),
+        {"Zel_Query", &expectZelRequest<Zel_QueryReq>}, ZEL_REQ(Zel_RefreshNodeReq),
+        ZEL_REQ(Zel_RemoveReservationReq), ZEL_REQ(Zel_RenameNodeReq), ZEL_REQ(Zel_RenameUniqueReq),
+        ZEL_REQ(Zel_SaveSettingsReq), ZEL_REQ(Zel_SetApplicationSettingsReq), ZEL_REQ(Zel_SetPropertiesReq),
+        ZEL_REQ(Zel_SetUserSettingsReq), ZEL_REQ(Zel_StartupReq)
+    };
+#undef ZEL_REQ
+    ASSERT_EQ(requests.size(), 55u);
+    for (const auto& request : requests) {
+        SCOPED_TRACE(request.first);
+        request.second(request.first);
+    }
     expectEngineRequest<Zel_GetPropertiesReq>("Zel_GetPropertiesReq");
     expectEngineRequest<Zel_LoginReq>("Zel_LoginReq");
     expectEngineRequest<Zel_RootNodeReq>("Zel_RootNodeReq");
