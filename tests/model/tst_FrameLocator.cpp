@@ -39,26 +39,20 @@ TEST(Zel_FrameLocatorTest, VirtualSlotsFollowTheListThenTheLocator)
     EXPECT_EQ(6, vtableSlot(static_cast<LocatorEq>(&Zel_FrameLocator::operator!=)));
 }
 
-TEST(Zel_FrameLocatorTest, PropertyRendersAndComparesKeyAndValue)
+TEST(Zel_FrameLocatorTest, PropertyAndListRenderAndCompareKeyAndValue)
 {
     Zel_FrameProperty property("k", "v");
     EXPECT_EQ(QStringLiteral("Zel_FrameProperty - key(k) value(v)"), property.toZelString());
     EXPECT_EQ(QStringLiteral("Zel_FrameProperty - key() value()"), Zel_FrameProperty().toZelString());
     EXPECT_TRUE(property == Zel_FrameProperty("k", "v"));
-    EXPECT_TRUE(property != Zel_FrameProperty("K", "v"));
-    EXPECT_TRUE(property != Zel_FrameProperty("k", "V"));
-
+    EXPECT_TRUE(property != Zel_FrameProperty("K", "v") && property != Zel_FrameProperty("k", "V"));
     property.setValue("w");
-    EXPECT_EQ(QStringLiteral("k"), property.key());
-    EXPECT_EQ(QStringLiteral("w"), property.value());
-}
+    EXPECT_EQ(QStringLiteral("k=w"), property.key() + '=' + property.value());
 
-TEST(Zel_FrameLocatorTest, ListRendersOnePropertyPerLine)
-{
+    // One property per line; through the base, a locator renders its properties only.
     EXPECT_EQ(QString(), Zel_FramePropertyList().toZelString());
     EXPECT_EQ(QStringLiteral("Zel_FrameProperty - key(k) value(v)\nZel_FrameProperty - key(a) value(b)"),
               list({{"k", "v"}, {"a", "b"}}).toZelString());
-    // Through the base, a locator renders its properties only.
     const Zel_FramePropertyList& base = locator("L", {{"k", "v"}});
     EXPECT_EQ(QStringLiteral("Zel_FrameProperty - key(k) value(v)"), base.toZelString());
 }
@@ -67,8 +61,7 @@ TEST(Zel_FrameLocatorTest, GetValueFindsTheFirstAndSetValueUpdatesOnlyIt)
 {
     Zel_FramePropertyList properties = list({{"k", "1"}, {"x", "y"}, {"k", "2"}});
     EXPECT_EQ(QStringLiteral("1"), properties.getValue("k"));
-    EXPECT_EQ(QString(), properties.getValue("missing"));
-    EXPECT_EQ(QString(), properties.getValue("K"));
+    EXPECT_TRUE((properties.getValue("missing") + properties.getValue("K")).isEmpty());
 
     properties.setValue("k", "changed");
     ASSERT_EQ(3, properties.size());
@@ -110,13 +103,11 @@ TEST(Zel_FrameLocatorTest, LongListEqualityCountsRepeatsToo)
         left.append(Zel_FrameProperty(QString::number(i % 20), "v"));
         right.prepend(Zel_FrameProperty(QString::number(i % 20), "v"));
     }
-    EXPECT_TRUE(left == right);
-    EXPECT_TRUE(right == left);
+    EXPECT_TRUE(left == right && right == left);
 
     Zel_FramePropertyList skewed = right;
     skewed[0] = Zel_FrameProperty(QString::number(1), "v"); // 1 three times, another key once
-    EXPECT_FALSE(left == skewed);
-    EXPECT_FALSE(skewed == left);
+    EXPECT_FALSE(left == skewed || skewed == left);
     EXPECT_TRUE(skewed != left);
 }
 
@@ -163,8 +154,7 @@ TEST(Zel_FrameLocatorTest, CopiesCarryIdentifierAndProperties)
     Zel_FrameLocator assigned = locator("other", {{"a", "b"}, {"c", "d"}});
     assigned = original;
     EXPECT_EQ(QStringLiteral("L9"), assigned.getID());
-    EXPECT_EQ(1, assigned.size());
-    EXPECT_EQ(QStringLiteral("v"), assigned.getValue("k"));
+    EXPECT_EQ(original.toZelString(), assigned.toZelString());
 
     copy.setValue("k", "changed");
     EXPECT_EQ(QStringLiteral("v"), original.getValue("k"));

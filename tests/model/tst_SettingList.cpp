@@ -38,15 +38,6 @@ QDomElement parse(const QString& xml)
     return document.documentElement();
 }
 
-// The child elements' names, in order.
-QStringList childNames(const QDomElement& element)
-{
-    QStringList names;
-    for (QDomElement child = element.firstChildElement(); !child.isNull(); child = child.nextSiblingElement())
-        names << child.tagName();
-    return names;
-}
-
 // The concatenated text nodes directly inside an element (not its children's).
 QString ownText(const QDomElement& element)
 {
@@ -61,6 +52,20 @@ QString ownText(const QDomElement& element)
 std::string str(const QString& text)
 {
     return text.toStdString();
+}
+
+// The element's children as "tag=own text(children)" words: the tree in one line.
+std::string outline(const QDomElement& element)
+{
+    std::string words;
+    for (QDomElement child = element.firstChildElement(); !child.isNull(); child = child.nextSiblingElement()) {
+        words += (words.empty() ? "" : " ") + str(child.tagName());
+        if (!ownText(child).isEmpty())
+            words += "=" + str(ownText(child));
+        if (!child.firstChildElement().isNull())
+            words += "(" + outline(child) + ")";
+    }
+    return words;
 }
 
 } // namespace
@@ -106,57 +111,25 @@ TEST(Zel_SettingListTest, XmlNestsDottedKeysWithOneBlankOfIndentPerLevel)
     EXPECT_EQ(QStringLiteral("Settings"), root.tagName());
     EXPECT_EQ(3, root.attributes().count());
     EXPECT_EQ(QStringLiteral("1.0"), root.attribute("version"));
-    EXPECT_EQ((QStringList{"General", "Recent"}), childNames(root));
-    const QDomElement general = root.firstChildElement("General");
-    EXPECT_EQ((QStringList{"Language", "Units"}), childNames(general));
-    EXPECT_EQ(QStringLiteral("en"), general.firstChildElement("Language").text());
-    EXPECT_EQ(QStringLiteral("metric"), general.firstChildElement("Units").text());
-    EXPECT_EQ(QString(), root.firstChildElement("Recent").text());
+    EXPECT_EQ(outline(root), "General(Language=en Units=metric) Recent");
 
     // Layout: no declaration, root start tag first, one blank per level,
     // leaves on one line, a line break after the root's end tag. The root's
     // attribute order is the serialiser's and is not compared.
-    QStringList lines = xml.split('\n');
-    ASSERT_EQ(8, lines.size()) << str(xml);
+    // An empty value is an empty text node, <Recent></Recent>, not <Recent/>.
+    const QStringList lines = xml.split('\n');
     EXPECT_TRUE(lines[0].startsWith("<Settings ")) << str(lines[0]);
-    EXPECT_EQ(QStringLiteral(" <General>"), lines[1]);
-    EXPECT_EQ(QStringLiteral("  <Language>en</Language>"), lines[2]);
-    EXPECT_EQ(QStringLiteral("  <Units>metric</Units>"), lines[3]);
-    EXPECT_EQ(QStringLiteral(" </General>"), lines[4]);
-    EXPECT_EQ(QStringLiteral(" <Recent></Recent>"), lines[5]); // an empty text node, not <Recent/>
-    EXPECT_EQ(QStringLiteral("</Settings>"), lines[6]);
-    EXPECT_EQ(QString(), lines[7]);
+    EXPECT_EQ(lines.mid(1), QStringList({" <General>", "  <Language>en</Language>", "  <Units>metric</Units>",
+                                         " </General>", " <Recent></Recent>", "</Settings>", ""}))
+        << str(xml);
 }
 
 TEST(Zel_SettingListTest, XmlSharesIntermediatesAndKeepsDuplicateLeavesInOrder)
 {
-    const QDomElement root = parse(settings({{"a.b", "1"},
-                                             {"a.d", "2"},
-                                             {"a.b", "3"},
-                                             {"x.y.z", "v"},
-                                             {"a.b", "4"},
-                                             {"x.y.w", "w"},
-                                             {"leaf", "first"},
-                                             {"leaf", "second"}})
+    const QDomElement root = parse(settings({{"a.b", "1"}, {"a.d", "2"}, {"a.b", "3"}, {"x.y.z", "v"}, {"a.b", "4"},
+                                             {"x.y.w", "w"}, {"leaf", "first"}, {"leaf", "second"}})
                                        .toXML("R"));
-    EXPECT_EQ((QStringList{"a", "x", "leaf", "leaf"}), childNames(root));
-
-    const QDomElement a = root.firstChildElement("a");
-    EXPECT_EQ((QStringList{"b", "d", "b", "b"}), childNames(a));
-    QStringList bValues;
-    for (QDomElement b = a.firstChildElement("b"); !b.isNull(); b = b.nextSiblingElement("b"))
-        bValues << b.text();
-    EXPECT_EQ((QStringList{"1", "3", "4"}), bValues);
-    EXPECT_EQ(QStringLiteral("2"), a.firstChildElement("d").text());
-
-    const QDomElement y = root.firstChildElement("x").firstChildElement("y");
-    EXPECT_EQ((QStringList{"z", "w"}), childNames(y));
-    EXPECT_EQ(QStringLiteral("v"), y.firstChildElement("z").text());
-    EXPECT_EQ(QStringLiteral("w"), y.firstChildElement("w").text());
-
-    const QDomElement firstLeaf = root.firstChildElement("leaf");
-    EXPECT_EQ(QStringLiteral("first"), firstLeaf.text());
-    EXPECT_EQ(QStringLiteral("second"), firstLeaf.nextSiblingElement("leaf").text());
+    EXPECT_EQ(outline(root), "a(b=1 d=2 b=3 b=4) x(y(z=v w=w)) leaf=first leaf=second");
 }
 
 TEST(Zel_SettingListTest, XmlLetsALeafGainChildrenThroughTheFirstElementOfThatName)
@@ -165,15 +138,7 @@ TEST(Zel_SettingListTest, XmlLetsALeafGainChildrenThroughTheFirstElementOfThatNa
     // element (the first child named a), not into the second leaf a.
     const QDomElement root =
         parse(settings({{"a", "x"}, {"a", "second"}, {"a.b", "y"}, {"a.b.c", "z"}}).toXML("R"));
-    EXPECT_EQ((QStringList{"a", "a"}), childNames(root));
-    const QDomElement first = root.firstChildElement("a");
-    EXPECT_EQ(QStringLiteral("x"), ownText(first));
-    EXPECT_EQ((QStringList{"b"}), childNames(first));
-    EXPECT_EQ(QStringLiteral("y"), ownText(first.firstChildElement("b")));
-    EXPECT_EQ(QStringLiteral("z"), first.firstChildElement("b").firstChildElement("c").text());
-    const QDomElement second = first.nextSiblingElement("a");
-    EXPECT_EQ(QStringLiteral("second"), second.text());
-    EXPECT_TRUE(childNames(second).isEmpty());
+    EXPECT_EQ(outline(root), "a=x(b=y(c=z)) a=second");
 }
 
 TEST(Zel_SettingListTest, XmlDropsEmptyKeysAndTheValuesOfKeysEndingInADot)
@@ -181,13 +146,9 @@ TEST(Zel_SettingListTest, XmlDropsEmptyKeysAndTheValuesOfKeysEndingInADot)
     TraceCapture trace;
     const QDomElement root =
         parse(settings({{"", "lost"}, {"p.", "lost too"}, {"q.r.", "also lost"}, {"s", ""}}).toXML("R"));
-    EXPECT_EQ((QStringList{"p", "q", "s"}), childNames(root));
+    EXPECT_EQ(outline(root), "p q(r) s");
     EXPECT_FALSE(root.firstChildElement("p").hasChildNodes());
-    const QDomElement q = root.firstChildElement("q");
-    EXPECT_EQ((QStringList{"r"}), childNames(q));
-    EXPECT_FALSE(q.firstChildElement("r").hasChildNodes());
-    EXPECT_EQ(QString(), root.firstChildElement("s").text());
-    EXPECT_FALSE(root.text().contains("lost"));
+    EXPECT_FALSE(root.firstChildElement("q").firstChildElement("r").hasChildNodes());
     // These are ordinary outcomes, not faults: no trace line.
     EXPECT_TRUE(trace.orvLines().empty());
 }
@@ -199,9 +160,7 @@ TEST(Zel_SettingListTest, EmptyListGivesTheRootWithItsThreeAttributesOnly)
     EXPECT_EQ(QStringLiteral("Settings"), root.tagName());
     EXPECT_FALSE(root.hasChildNodes());
     EXPECT_EQ(3, root.attributes().count());
-    EXPECT_TRUE(root.hasAttribute("version"));
-    EXPECT_TRUE(root.hasAttribute("modifydate"));
-    EXPECT_TRUE(root.hasAttribute("modifydateInt"));
+    EXPECT_TRUE(root.hasAttribute("version") && root.hasAttribute("modifydate") && root.hasAttribute("modifydateInt"));
     EXPECT_TRUE(xml.endsWith("/>\n")) << str(xml);
     EXPECT_EQ(1, xml.count('\n'));
 
@@ -209,47 +168,17 @@ TEST(Zel_SettingListTest, EmptyListGivesTheRootWithItsThreeAttributesOnly)
     EXPECT_EQ(QStringLiteral("my.Settings"), parse(Zel_SettingList().toXML("my.Settings")).tagName());
 }
 
-TEST(Zel_SettingListTest, ModifyDateIntIsTheCurrentTimeInWholeSeconds)
-{
-    const qint64 before = QDateTime::currentDateTimeUtc().toSecsSinceEpoch();
-    const QDomElement root = parse(settings({{"k", "v"}}).toXML("R"));
-    const qint64 after = QDateTime::currentDateTimeUtc().toSecsSinceEpoch();
-
-    const QString stamp = root.attribute("modifydateInt");
-    EXPECT_TRUE(QRegularExpression("^[0-9]+$").match(stamp).hasMatch()) << str(stamp);
-    bool ok = false;
-    const qint64 seconds = stamp.toLongLong(&ok);
-    ASSERT_TRUE(ok);
-    EXPECT_LE(before, seconds);
-    EXPECT_GE(after, seconds);
-
-    // "modifydate" names the same moment in local time, TextDate form.
-    const QDateTime local = QDateTime::fromSecsSinceEpoch(seconds).toLocalTime();
-    const QString date = root.attribute("modifydate");
-    const QDateTime parsed = QDateTime::fromString(date, Qt::TextDate);
-    if (parsed.isValid()) {
-        EXPECT_EQ(local, parsed) << str(date);
-    } else {
-        // Locale day and month names the parser may not read back: check the
-        // parts that do not depend on the locale.
-        EXPECT_TRUE(date.contains(local.time().toString("hh:mm:ss"))) << str(date);
-        EXPECT_TRUE(date.endsWith(QString::number(local.date().year()))) << str(date);
-    }
-}
-
-TEST(Zel_SettingListTest, ModifyDateOfAFixedMomentIsWrittenInBothForms)
+TEST(Zel_SettingListTest, ModifyDateIsWrittenInBothFormsAndDefaultsToNow)
 {
     const QDateTime moment(QDate(2001, 9, 9), QTime(1, 46, 40), Qt::UTC);
     const QDomElement root = parse(settings({{"k", "v"}}).toXML("R", moment));
     EXPECT_EQ(QStringLiteral("1000000000"), root.attribute("modifydateInt"));
     EXPECT_EQ(QStringLiteral("1.0"), root.attribute("version"));
-
+    // Local time in TextDate form: day name, month name, day, hh:mm:ss, four-digit year.
     const QString date = root.attribute("modifydate");
     EXPECT_EQ(moment.toLocalTime().toString(Qt::TextDate), date);
-    // Day name, month name, day of month, hh:mm:ss, four-digit year.
     EXPECT_TRUE(QRegularExpression("^\\S+ \\S+ \\d{1,2} \\d{2}:\\d{2}:\\d{2} \\d{4}$").match(date).hasMatch())
         << str(date);
-    EXPECT_TRUE(date.contains(moment.toLocalTime().time().toString("hh:mm:ss"))) << str(date);
 
     // Outside the unsigned 32-bit range the stamp saturates instead of wrapping.
     const QDateTime early(QDate(1969, 12, 31), QTime(23, 59, 59), Qt::UTC);
@@ -257,12 +186,17 @@ TEST(Zel_SettingListTest, ModifyDateOfAFixedMomentIsWrittenInBothForms)
     const QDateTime last(QDate(2106, 2, 7), QTime(6, 28, 14), Qt::UTC);
     EXPECT_EQ(QStringLiteral("4294967294"), parse(Zel_SettingList().toXML("R", last)).attribute("modifydateInt"));
 
-    // An invalid moment is replaced by the current time.
+    // No moment, or an invalid one: the current time in whole seconds.
     const qint64 before = QDateTime::currentDateTimeUtc().toSecsSinceEpoch();
-    const qint64 stamped =
-        parse(Zel_SettingList().toXML("R", QDateTime())).attribute("modifydateInt").toLongLong();
-    EXPECT_LE(before, stamped);
-    EXPECT_GE(QDateTime::currentDateTimeUtc().toSecsSinceEpoch(), stamped);
+    const Zel_SettingList empty;
+    for (const QDomElement& stamped : {parse(empty.toXML("R")), parse(empty.toXML("R", QDateTime()))}) {
+        const QString seconds = stamped.attribute("modifydateInt");
+        EXPECT_TRUE(QRegularExpression("^[0-9]+$").match(seconds).hasMatch()) << str(seconds);
+        EXPECT_LE(before, seconds.toLongLong());
+        EXPECT_GE(QDateTime::currentDateTimeUtc().toSecsSinceEpoch(), seconds.toLongLong());
+        EXPECT_EQ(QDateTime::fromSecsSinceEpoch(seconds.toLongLong()).toLocalTime().toString(Qt::TextDate),
+                  stamped.attribute("modifydate"));
+    }
 }
 
 TEST(Zel_SettingListTest, KeysGivingInvalidNamesAreLeftOutWithOneTraceLineEach)
@@ -270,36 +204,24 @@ TEST(Zel_SettingListTest, KeysGivingInvalidNamesAreLeftOutWithOneTraceLineEach)
     TraceCapture trace;
     const QDomImplementation::InvalidDataPolicy policy = QDomImplementation::invalidDataPolicy();
 
-    const QString xml = settings({{"good", "1"},
-                                  {"a b", "space"},
-                                  {"1x", "digit first"},
-                                  {"x<y", "angle"},
-                                  {"ok.a b", "bad leaf"},
-                                  {"bad one.ok", "bad intermediate"},
-                                  {"a..b", "empty level"},
-                                  {".", "dot"},
-                                  {".x", "leading dot"},
-                                  {"ns:name", "colon"},
-                                  {"-x", "dash first"},
-                                  {"x&y", "ampersand"},
-                                  {"tail", "2"}})
+    const QString xml = settings({{"good", "1"}, {"a b", "space"}, {"1x", "digit first"}, {"x<y", "angle"},
+                                  {"ok.a b", "bad leaf"}, {"bad one.ok", "bad intermediate"}, {"a..b", "empty level"},
+                                  {".", "dot"}, {".x", "leading dot"}, {"ns:name", "colon"}, {"-x", "dash first"},
+                                  {"x&y", "ampersand"}, {"tail", "2"}})
                             .toXML("R");
     EXPECT_EQ(policy, QDomImplementation::invalidDataPolicy());
 
     const QDomElement root = parse(xml);
     // Nothing at all is made for a rejected key, not even its valid levels.
-    EXPECT_EQ((QStringList{"good", "tail"}), childNames(root)) << str(xml);
-    EXPECT_EQ(QStringLiteral("1"), root.firstChildElement("good").text());
-    EXPECT_EQ(QStringLiteral("2"), root.firstChildElement("tail").text());
+    EXPECT_EQ(outline(root), "good=1 tail=2") << str(xml);
 
     const std::vector<std::string> lines = trace.orvLines();
     ASSERT_EQ(11u, lines.size());
-    EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"a b\" does not give valid XML element names; setting left out",
-              lines[0]);
-    EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"1x\" does not give valid XML element names; setting left out",
-              lines[1]);
-    EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"x<y\" does not give valid XML element names; setting left out",
-              lines[2]);
+    const char* const firstKeys[] = {"a b", "1x", "x<y"};
+    for (int i = 0; i < 3; ++i)
+        EXPECT_EQ("ZEL: Zel_SettingList::toXML: key \"" + std::string(firstKeys[i])
+                      + "\" does not give valid XML element names; setting left out",
+                  lines[i]);
     EXPECT_NE(std::string::npos, lines[9].find("\"-x\""));
 }
 
@@ -321,15 +243,10 @@ TEST(Zel_SettingListTest, ValuesRoundTripWithCharactersXmlCannotCarryRemoved)
     const QString markup = QStringLiteral("<tag attr=\"v\"> & 'q' ]]> &amp;");
     const QString lineBreaks = QStringLiteral("a\r\nb\rc\td\ne");
     const QString nonAscii = QString::fromUtf8("Grüße 日本 \xF0\x9F\x98\x80 end");
-    QString controls = QStringLiteral("x");
-    controls += QChar(0x01);
-    controls += QChar(0x1B);
-    controls += QChar(0xFFFE);
-    controls += QChar(0xFFFF);
-    controls += QChar(0xD800); // high surrogate without its low half
-    controls += QStringLiteral("y");
-    controls += QChar(0xDC00); // low surrogate alone
-    controls += QChar(char16_t(0));
+    // Controls, non-characters, a high surrogate without its low half, a low one alone, NUL.
+    QString controls;
+    for (char16_t unit : {u'x', u'\x01', u'\x1B', u'\xFFFE', u'\xFFFF', char16_t(0xD800), u'y', char16_t(0xDC00), u'\0'})
+        controls += QChar(unit);
 
     Zel_SettingList list;
     list.append(Zel_Setting("markup", markup));
@@ -343,10 +260,7 @@ TEST(Zel_SettingListTest, ValuesRoundTripWithCharactersXmlCannotCarryRemoved)
     EXPECT_EQ(lineBreaks, root.firstChildElement("breaks").text());
     EXPECT_EQ(nonAscii, root.firstChildElement("unicode").text());
     EXPECT_EQ(QStringLiteral("xy"), root.firstChildElement("controls").text());
-    EXPECT_EQ(QStringLiteral("named"), root.firstChildElement("Einstellung")
-                                           .firstChildElement(QString::fromUtf8("Größe"))
-                                           .firstChildElement(QString::fromUtf8("日本"))
-                                           .text());
+    EXPECT_EQ(outline(root.lastChildElement()), "Größe(日本=named)");
 }
 
 TEST(Zel_SettingListTest, WideListsAreBuiltInLinearTime)
@@ -412,9 +326,5 @@ TEST(Zel_SettingListTest, EveryCharacterInKeysAndValuesGivesWellFormedXml)
 
     const QDomElement root =
         parse(settings({{"_", "1"}, {"a-b.c_d.e1", "2"}, {"xmlns", "3"}, {"É.日本.ß", "4"}}).toXML("R"));
-    EXPECT_EQ((QStringList{"_", "a-b", "xmlns", "É"}), childNames(root));
-    EXPECT_EQ(QStringLiteral("4"), root.firstChildElement("É")
-                                       .firstChildElement(QString::fromUtf8("日本"))
-                                       .firstChildElement(QString::fromUtf8("ß"))
-                                       .text());
+    EXPECT_EQ(outline(root), "_=1 a-b(c_d(e1=2)) xmlns=3 É(日本(ß=4))");
 }

@@ -57,20 +57,16 @@ TEST(Zel_MobIDTest, EmptinessAndExactEquality)
 
 TEST(Zel_MobIDTest, OrdersByCodeUnitAndAgreesWithEquality)
 {
-    auto less = [](const QString& a, const QString& b) { return Zel_MobID(a) < Zel_MobID(b); };
-    EXPECT_TRUE(less(QStringLiteral("A"), QStringLiteral("a")));
-    EXPECT_FALSE(less(QStringLiteral("a"), QStringLiteral("A")));
-    EXPECT_TRUE(less(QStringLiteral("ab"), QStringLiteral("abc")));
-    EXPECT_FALSE(less(QStringLiteral("abc"), QStringLiteral("ab")));
-    EXPECT_TRUE(less(QString(), QStringLiteral("0")));
-    EXPECT_FALSE(less(QStringLiteral("abc"), QStringLiteral("abc")));
-    // Numbers are not interpreted: "10" < "9".
-    EXPECT_TRUE(less(QStringLiteral("10"), QStringLiteral("9")));
-    // Code units, not locale: 'Z' (0x5A) < 'a' (0x61) < U+00E9.
-    EXPECT_TRUE(less(QStringLiteral("Z"), QStringLiteral("a")));
-    EXPECT_TRUE(less(QStringLiteral("a"), QString(QChar(0xE9))));
-    // U+1F600 is the surrogate pair D83D DE00, below U+FB01 by code unit.
-    EXPECT_TRUE(less(QString::fromUtf8("\xF0\x9F\x98\x80"), QString(QChar(0xFB01))));
+    // Code units, not locale or numbers: "10" < "9", 'Z' (0x5A) < 'a' (0x61) < U+00E9, and U+1F600
+    // (the surrogate pair D83D DE00) < U+FB01.
+    const std::vector<std::pair<QString, QString>> ascending = {
+        {"A", "a"}, {"ab", "abc"}, {QString(), "0"}, {"10", "9"}, {"Z", "a"}, {"a", QString(QChar(0xE9))},
+        {QString::fromUtf8("\xF0\x9F\x98\x80"), QString(QChar(0xFB01))}};
+    for (const auto& pair : ascending) {
+        EXPECT_TRUE(Zel_MobID(pair.first) < Zel_MobID(pair.second)) << pair.first.toStdString();
+        EXPECT_FALSE(Zel_MobID(pair.second) < Zel_MobID(pair.first)) << pair.first.toStdString();
+    }
+    EXPECT_FALSE(Zel_MobID(QStringLiteral("abc")) < Zel_MobID(QStringLiteral("abc")));
 
     // Usable as a key of ordered containers: null and empty are one key.
     std::map<Zel_MobID, int> map;
@@ -147,42 +143,27 @@ TEST(Zel_MobIDListTest, CopiesShareEntriesAndAssignmentReplaces)
     EXPECT_EQ(target.size(), 0u);
 }
 
-TEST(Zel_MobDescTest, ConstructorsAndIsNull)
+TEST(Zel_MobDescTest, IsNullUnlessAnIdentifierOrAPathOtherThanOMAAFIsSetAndCopiesCarryAllSixFields)
 {
-    const Zel_MobDesc empty;
-    EXPECT_TRUE(empty.isNull());
-    EXPECT_FALSE(empty.getGenerateFexSpaaf());
-
+    EXPECT_TRUE(Zel_MobDesc().isNull());
     const Zel_MobDesc three(QStringLiteral("mob"), QStringLiteral("/aaf"), QStringLiteral("/head"));
-    EXPECT_EQ(three.getMobID().toStdString(), "mob");
-    EXPECT_EQ(three.getAAFFilePath().toStdString(), "/aaf");
-    EXPECT_EQ(three.getHeadFrameFilePath().toStdString(), "/head");
-    EXPECT_TRUE(three.getOMAAFFilePath().isEmpty());
-    EXPECT_TRUE(three.getOMF2FilePath().isEmpty());
+    EXPECT_EQ((three.getMobID() + three.getAAFFilePath() + three.getHeadFrameFilePath()).toStdString(), "mob/aaf/head");
+    EXPECT_TRUE((three.getOMAAFFilePath() + three.getOMF2FilePath()).isEmpty());
     EXPECT_FALSE(three.getGenerateFexSpaaf());
     EXPECT_FALSE(three.isNull());
 
-    Zel_MobDesc onlyOMAAF;
-    onlyOMAAF.setOMAAFFilePath(QStringLiteral("/omaaf"));
-    EXPECT_TRUE(onlyOMAAF.isNull());
+    const std::vector<std::pair<void (Zel_MobDesc::*)(const QString&), bool>> setters = {
+        {&Zel_MobDesc::setOMAAFFilePath, true}, {&Zel_MobDesc::setHeadFrameFilePath, false},
+        {&Zel_MobDesc::setOMF2FilePath, false}, {&Zel_MobDesc::setAAFFilePath, false}, {&Zel_MobDesc::setMobID, false}};
+    for (std::size_t i = 0; i < setters.size(); ++i) {
+        Zel_MobDesc d;
+        (d.*setters[i].first)(QStringLiteral("/x"));
+        EXPECT_EQ(d.isNull(), setters[i].second) << "setter " << i;
+    }
     Zel_MobDesc onlyFlag;
     onlyFlag.setGenerateFexSpaaf(true);
     EXPECT_TRUE(onlyFlag.isNull());
 
-    Zel_MobDesc d;
-    d.setHeadFrameFilePath(QStringLiteral("/h"));
-    EXPECT_FALSE(d.isNull());
-    d = Zel_MobDesc();
-    d.setOMF2FilePath(QStringLiteral("/omf2"));
-    EXPECT_FALSE(d.isNull());
-    d = Zel_MobDesc();
-    d.setAAFFilePath(QStringLiteral("/a"));
-    EXPECT_FALSE(d.isNull());
-    d = Zel_MobDesc();
-    d.setMobID(QStringLiteral("m"));
-    EXPECT_FALSE(d.isNull());
-
-    // Copies carry all six fields.
     Zel_MobDesc full(QStringLiteral("m"), QStringLiteral("a"), QStringLiteral("h"));
     full.setOMAAFFilePath(QStringLiteral("o"));
     full.setOMF2FilePath(QStringLiteral("f"));

@@ -10,7 +10,7 @@
 
 #include <gtest/gtest.h>
 
-#include <map>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -25,69 +25,38 @@ std::string str(const QString& text)
 class TaggedManager : public Zel_PropertyManager
 {
 public:
-    explicit TaggedManager(const QString& tag, bool answer = false)
-        : mTag(tag)
-        , mAnswer(answer)
-    {
-    }
+    explicit TaggedManager(const QString& tag, bool answer = false) : mTag(tag), mAnswer(answer) {}
 
-    QString getDisplayName(const QString& key) override
-    {
-        record(QStringLiteral("getDisplayName(") + key + QLatin1Char(')'));
-        return mTag + QStringLiteral("-display-") + key;
-    }
-    bool getIsModifiable(const QString& key) override
-    {
-        record(QStringLiteral("getIsModifiable(") + key + QLatin1Char(')'));
-        return mAnswer;
-    }
-    bool getIsAvailable(const QString& key) override
-    {
-        record(QStringLiteral("getIsAvailable(") + key + QLatin1Char(')'));
-        return mAnswer;
-    }
-    QString getInternalName(const QString& key) override
-    {
-        record(QStringLiteral("getInternalName(") + key + QLatin1Char(')'));
-        return mTag + QStringLiteral("-internal-") + key;
-    }
+    QString getDisplayName(const QString& key) override { return ask("getDisplayName", key, "-display-"); }
+    bool getIsModifiable(const QString& key) override { ask("getIsModifiable", key); return mAnswer; }
+    bool getIsAvailable(const QString& key) override { ask("getIsAvailable", key); return mAnswer; }
+    QString getInternalName(const QString& key) override { return ask("getInternalName", key, "-internal-"); }
     bool getIsType(Zel_PropertyKeyType type, const QString& key) override
     {
-        record(QStringLiteral("getIsType(%1,").arg(static_cast<int>(type)) + key + QLatin1Char(')'));
+        ask("getIsType", QString::number(static_cast<int>(type)) + QLatin1Char(',') + key);
         return mTrueTypes.count(static_cast<int>(type)) ? true : mAnswer;
     }
-    bool getIsTextSearchable(const QString& key) override
-    {
-        record(QStringLiteral("getIsTextSearchable(") + key + QLatin1Char(')'));
-        return mAnswer;
-    }
-    bool getHasCustomValues(const QString& key) override
-    {
-        record(QStringLiteral("getHasCustomValues(") + key + QLatin1Char(')'));
-        return !mAnswer;
-    }
-    QStringList getKeys() override
-    {
-        record(QStringLiteral("getKeys()"));
-        return QStringList();
-    }
-    QString getKeyByDisplayName(const QString& displayName) override
-    {
-        record(QStringLiteral("getKeyByDisplayName(") + displayName + QLatin1Char(')'));
-        return mTag + QStringLiteral("-key-") + displayName;
-    }
+    bool getIsTextSearchable(const QString& key) override { ask("getIsTextSearchable", key); return mAnswer; }
+    bool getHasCustomValues(const QString& key) override { ask("getHasCustomValues", key); return !mAnswer; }
+    QStringList getKeys() override { ask("getKeys", QString()); return QStringList(); }
+    QString getKeyByDisplayName(const QString& name) override { return ask("getKeyByDisplayName", name, "-key-"); }
 
-    void answerTrueForType(int type) { mTrueTypes[type] = true; }
+    void answerTrueForType(int type) { mTrueTypes.insert(type); }
     // The questions asked so far, joined by "|".
     std::string calls() const { return mCalls.join(QLatin1Char('|')).toStdString(); }
     int callCount() const { return mCalls.size(); }
 
 private:
-    void record(const QString& call) { mCalls.append(call); }
+    // Records "question(argument)"; answers "<tag><infix><argument>".
+    QString ask(const char* question, const QString& argument, const char* infix = "")
+    {
+        mCalls.append(QLatin1String(question) + QLatin1Char('(') + argument + QLatin1Char(')'));
+        return mTag + QLatin1String(infix) + argument;
+    }
 
     QString mTag;
     bool mAnswer;
-    std::map<int, bool> mTrueTypes;
+    std::set<int> mTrueTypes;
     QStringList mCalls;
 };
 
@@ -108,6 +77,37 @@ Zel_Property prop(const char* key, const char* value, const char* custom = "")
     return Zel_Property(QString::fromLatin1(key), QString::fromLatin1(value), QString::fromLatin1(custom));
 }
 
+boost::shared_ptr<TaggedManager> manager(const char* tag, bool answer = false)
+{
+    return boost::make_shared<TaggedManager>(QString::fromLatin1(tag), answer);
+}
+
+// The static questions' answers about "Name": display name, key by display
+// name, custom values, modifiable, of type None.
+std::string staticAnswers()
+{
+    const QString name = QStringLiteral("Name");
+    std::string text = str(Zel_Property::getDisplayName(name)) + '|';
+    text += str(Zel_Property::getKeyByDisplayName(name)) + '|';
+    text += char('0' + Zel_Property::getHasCustomValues(name));
+    text += char('0' + Zel_Property::getIsModifiable(name));
+    return text + char('0' + Zel_Property::getIsType(Zel_PropertyKeyType_None, name));
+}
+
+// A property's answers through the manager (or, when empty, the registered
+// one): display name | internal name | available, modifiable, text
+// searchable, of type None as 0/1.
+std::string answers(const Zel_Property& p, boost::shared_ptr<Zel_PropertyManager> m = boost::shared_ptr<Zel_PropertyManager>())
+{
+    // One question per statement: the managers record the order they are asked in.
+    std::string text = str(p.displayName(m)) + '|';
+    text += str(p.internalName(m)) + '|';
+    text += char('0' + p.isAvailable(m));
+    text += char('0' + p.isModifiable(m));
+    text += char('0' + p.isTextSearchable(m));
+    return text + char('0' + p.isType(Zel_PropertyKeyType_None, m));
+}
+
 // "key=value/custom" per element, for whole-list comparisons.
 std::vector<std::string> contents(const Zel_PropertyList& list)
 {
@@ -122,56 +122,34 @@ std::vector<std::string> contents(const Zel_PropertyList& list)
 TEST_F(Zel_PropertyTest, AnswersFallbacksWithoutManager)
 {
     EXPECT_FALSE(Zel_Property::getPropertyManagerSP());
-    EXPECT_FALSE(Zel_Property::getHasCustomValues(QStringLiteral("Name")));
-    EXPECT_TRUE(Zel_Property::getIsModifiable(QStringLiteral("Name")));
-    EXPECT_TRUE(Zel_Property::getIsType(Zel_PropertyKeyType_None, QStringLiteral("Name")));
-    EXPECT_TRUE(Zel_Property::getDisplayName(QStringLiteral("Name")).isEmpty());
-    EXPECT_TRUE(Zel_Property::getKeyByDisplayName(QStringLiteral("Name")).isEmpty());
+    EXPECT_EQ(staticAnswers(), "||011");
 
     const Zel_Property p = prop("Name", "x");
-    EXPECT_TRUE(p.displayName().isEmpty());
-    EXPECT_TRUE(p.internalName().isEmpty());
-    EXPECT_TRUE(p.isAvailable());
-    EXPECT_TRUE(p.isModifiable());
-    EXPECT_TRUE(p.isTextSearchable());
-    EXPECT_TRUE(p.isType(static_cast<Zel_PropertyKeyType>(77)));
-    EXPECT_TRUE(p.isResolution());
+    EXPECT_EQ(answers(p), "||1111");
+    EXPECT_TRUE(p.isResolution() && p.isType(static_cast<Zel_PropertyKeyType>(77)));
     EXPECT_EQ(str(p), "Zel_Property(Name:x::)");
 }
 
 TEST_F(Zel_PropertyTest, TraceFormTakesNamesFromRegisteredManager)
 {
-    const boost::shared_ptr<TaggedManager> manager = boost::make_shared<TaggedManager>(QStringLiteral("reg"));
-    Zel_Property::setPropertyManagerSP(manager);
-    EXPECT_EQ(str(prop("Name", "x", "ignored")),
-              "Zel_Property(Name:x:reg-display-Name:reg-internal-Name)");
-    EXPECT_EQ(manager->calls(), "getDisplayName(Name)|getInternalName(Name)");
+    const boost::shared_ptr<TaggedManager> registered = manager("reg");
+    Zel_Property::setPropertyManagerSP(registered);
+    EXPECT_EQ(str(prop("Name", "x", "ignored")), "Zel_Property(Name:x:reg-display-Name:reg-internal-Name)");
+    EXPECT_EQ(registered->calls(), "getDisplayName(Name)|getInternalName(Name)");
 }
 
 TEST_F(Zel_PropertyTest, ResolvesArgumentThenRegisteredThenFallback)
 {
-    const boost::shared_ptr<TaggedManager> registered = boost::make_shared<TaggedManager>(QStringLiteral("reg"), false);
-    const boost::shared_ptr<TaggedManager> argument = boost::make_shared<TaggedManager>(QStringLiteral("arg"), true);
+    const boost::shared_ptr<TaggedManager> registered = manager("reg", false);
+    const boost::shared_ptr<TaggedManager> argument = manager("arg", true);
     Zel_Property::setPropertyManagerSP(registered);
     ASSERT_EQ(Zel_Property::getPropertyManagerSP(), registered);
 
     const Zel_Property p = prop("Tape", "t1");
-    // The argument wins, for that call only.
-    EXPECT_EQ(str(p.displayName(argument)), "arg-display-Tape");
-    EXPECT_EQ(str(p.internalName(argument)), "arg-internal-Tape");
-    EXPECT_TRUE(p.isAvailable(argument));
-    EXPECT_TRUE(p.isModifiable(argument));
-    EXPECT_TRUE(p.isTextSearchable(argument));
-    EXPECT_TRUE(p.isType(Zel_PropertyKeyType_None, argument));
+    // The argument wins, for that call only; without one the registered manager answers.
+    EXPECT_EQ(answers(p, argument), "arg-display-Tape|arg-internal-Tape|1111");
     EXPECT_EQ(registered->calls(), "");
-
-    // Without an argument the registered manager answers.
-    EXPECT_EQ(str(p.displayName()), "reg-display-Tape");
-    EXPECT_EQ(str(p.internalName()), "reg-internal-Tape");
-    EXPECT_FALSE(p.isAvailable());
-    EXPECT_FALSE(p.isModifiable());
-    EXPECT_FALSE(p.isTextSearchable());
-    EXPECT_FALSE(p.isType(Zel_PropertyKeyType_None));
+    EXPECT_EQ(answers(p), "reg-display-Tape|reg-internal-Tape|0000");
     EXPECT_EQ(registered->calls(),
               "getDisplayName(Tape)|getInternalName(Tape)|getIsAvailable(Tape)|getIsModifiable(Tape)|"
               "getIsTextSearchable(Tape)|getIsType(0,Tape)");
@@ -191,32 +169,29 @@ TEST_F(Zel_PropertyTest, ResolvesArgumentThenRegisteredThenFallback)
     // An empty pointer unregisters.
     Zel_Property::setPropertyManagerSP(boost::shared_ptr<Zel_PropertyManager>());
     EXPECT_FALSE(Zel_Property::getPropertyManagerSP());
-    EXPECT_TRUE(p.displayName().isEmpty());
-    EXPECT_TRUE(p.isModifiable());
+    EXPECT_EQ(answers(p), "||1111");
     EXPECT_EQ(registered->callCount(), 11);
 }
 
 TEST_F(Zel_PropertyTest, DestroyedManagerReadsAsNoneAndIsNeverOwned)
 {
-    boost::shared_ptr<TaggedManager> manager = boost::make_shared<TaggedManager>(QStringLiteral("gone"), false);
-    const boost::weak_ptr<TaggedManager> watch = manager;
-    Zel_Property::setPropertyManagerSP(manager);
+    boost::shared_ptr<TaggedManager> gone = manager("gone", false);
+    const boost::weak_ptr<TaggedManager> watch = gone;
+    Zel_Property::setPropertyManagerSP(gone);
     EXPECT_FALSE(Zel_Property::getIsModifiable(QStringLiteral("Name")));
-    EXPECT_EQ(manager.use_count(), 1); // the registration holds no strong reference
+    EXPECT_EQ(gone.use_count(), 1); // the registration holds no strong reference
 
-    manager.reset();
+    gone.reset();
     EXPECT_TRUE(watch.expired());
     EXPECT_FALSE(Zel_Property::getPropertyManagerSP());
-    EXPECT_TRUE(Zel_Property::getIsModifiable(QStringLiteral("Name")));
-    EXPECT_TRUE(Zel_Property::getIsType(Zel_PropertyKeyType_None, QStringLiteral("Name")));
-    EXPECT_FALSE(Zel_Property::getHasCustomValues(QStringLiteral("Name")));
-    EXPECT_TRUE(Zel_Property::getKeyByDisplayName(QStringLiteral("Name")).isEmpty());
+    EXPECT_EQ(staticAnswers(), "||011");
+    EXPECT_EQ(answers(prop("Name", "x")), "||1111");
     EXPECT_EQ(str(prop("Name", "x")), "Zel_Property(Name:x::)");
     EXPECT_TRUE(prop("Name", "x").isResolution());
 
     // Registering another manager replaces the first at once.
-    const boost::shared_ptr<TaggedManager> first = boost::make_shared<TaggedManager>(QStringLiteral("one"));
-    const boost::shared_ptr<TaggedManager> second = boost::make_shared<TaggedManager>(QStringLiteral("two"));
+    const boost::shared_ptr<TaggedManager> first = manager("one");
+    const boost::shared_ptr<TaggedManager> second = manager("two");
     Zel_Property::setPropertyManagerSP(first);
     Zel_Property::setPropertyManagerSP(second);
     EXPECT_EQ(str(Zel_Property::getDisplayName(QStringLiteral("k"))), "two-display-k");
@@ -225,19 +200,18 @@ TEST_F(Zel_PropertyTest, DestroyedManagerReadsAsNoneAndIsNeverOwned)
 
 TEST_F(Zel_PropertyTest, IsResolutionAsksTypeTwoThenThree)
 {
-    const boost::shared_ptr<TaggedManager> onlyThree = boost::make_shared<TaggedManager>(QStringLiteral("m"), false);
+    const boost::shared_ptr<TaggedManager> onlyThree = manager("m", false);
     onlyThree->answerTrueForType(3);
     const Zel_Property p = prop("Res", "1080");
     EXPECT_TRUE(p.isResolution(onlyThree));
-    EXPECT_EQ(onlyThree->calls(),
-              "getIsType(2,Res)|getIsType(3,Res)");
+    EXPECT_EQ(onlyThree->calls(), "getIsType(2,Res)|getIsType(3,Res)");
 
-    const boost::shared_ptr<TaggedManager> onlyTwo = boost::make_shared<TaggedManager>(QStringLiteral("m"), false);
+    const boost::shared_ptr<TaggedManager> onlyTwo = manager("m", false);
     onlyTwo->answerTrueForType(2);
     EXPECT_TRUE(p.isResolution(onlyTwo));
     EXPECT_EQ(onlyTwo->calls(), "getIsType(2,Res)");
 
-    const boost::shared_ptr<TaggedManager> neither = boost::make_shared<TaggedManager>(QStringLiteral("m"), false);
+    const boost::shared_ptr<TaggedManager> neither = manager("m", false);
     EXPECT_FALSE(p.isResolution(neither));
 
     // Through the registered manager as well.
@@ -255,9 +229,7 @@ TEST_F(Zel_PropertyTest, EqualityIgnoresCustomValuesAndEmptinessIgnoresThem)
     EXPECT_TRUE(prop("Name", "a") != prop("Name", "A"));
 
     const Zel_Property null;
-    EXPECT_TRUE(null.key().isNull());
-    EXPECT_TRUE(null.value().isNull());
-    EXPECT_TRUE(null.customValues().isNull());
+    EXPECT_TRUE(null.key().isNull() && null.value().isNull() && null.customValues().isNull());
     EXPECT_TRUE(null.isEmpty());
     EXPECT_TRUE(prop("", "", "custom only").isEmpty());
     EXPECT_FALSE(prop("", "v").isEmpty());
@@ -268,7 +240,7 @@ TEST_F(Zel_PropertyTest, EqualityIgnoresCustomValuesAndEmptinessIgnoresThem)
     EXPECT_EQ(str(p.key() + p.value() + p.customValues()), "Namebc");
 }
 
-TEST_F(Zel_PropertyListTest, AddOrUpdateReplacesOnlyTheValueInPlace)
+TEST_F(Zel_PropertyListTest, AddOrUpdateReplacesOnlyTheValueInPlaceTheOtherAddsKeepTheFirst)
 {
     Zel_PropertyList list;
     list.addOrUpdate(prop("First", "1"));
@@ -278,11 +250,9 @@ TEST_F(Zel_PropertyListTest, AddOrUpdateReplacesOnlyTheValueInPlace)
     EXPECT_EQ(contents(list), (std::vector<std::string>{ "First=1/", "Name=b/c1", "Last=9/" }));
     list.addOrUpdate(prop("name", "lower"));
     EXPECT_EQ(contents(list), (std::vector<std::string>{ "First=1/", "Name=b/c1", "Last=9/", "name=lower/" }));
-}
 
-TEST_F(Zel_PropertyListTest, AddIfKeyNotInListAndPlusEqualsKeepTheFirst)
-{
-    Zel_PropertyList list;
+    // addIfKeyNotInList and += keep the first.
+    list.clear();
     list.addIfKeyNotInList(prop("Name", "a", "c1"));
     list.addIfKeyNotInList(prop("Name", "other", "c2"));
     QList<Zel_Property>& returned = (list += prop("Name", "third"));
@@ -302,9 +272,7 @@ TEST_F(Zel_PropertyListTest, FindAndEraseWorkOnTheFirstExactKey)
 
     EXPECT_EQ(str(list.findByKey(QStringLiteral("Name")).value()), "first");
     const Zel_Property missing = list.findByKey(QStringLiteral("name"));
-    EXPECT_TRUE(missing.key().isNull());
-    EXPECT_TRUE(missing.value().isNull());
-    EXPECT_TRUE(missing.customValues().isNull());
+    EXPECT_TRUE(missing.key().isNull() && missing.value().isNull() && missing.customValues().isNull());
 
     EXPECT_FALSE(list.eraseByKey(QStringLiteral("name")));
     EXPECT_EQ(list.size(), 3);
@@ -324,8 +292,8 @@ TEST_F(Zel_PropertyListTest, TraceFormJoinsElementsWithNewlines)
     list += prop("Tape", "y");
     EXPECT_EQ(str(list), "Zel_Property(Name:x::)\nZel_Property(Tape:y::)");
 
-    const boost::shared_ptr<TaggedManager> manager = boost::make_shared<TaggedManager>(QStringLiteral("m"));
-    Zel_Property::setPropertyManagerSP(manager);
+    const boost::shared_ptr<TaggedManager> m = manager("m"); // the registration holds it weakly
+    Zel_Property::setPropertyManagerSP(m);
     EXPECT_EQ(str(list), "Zel_Property(Name:x:m-display-Name:m-internal-Name)\n"
                          "Zel_Property(Tape:y:m-display-Tape:m-internal-Tape)");
 
@@ -341,49 +309,29 @@ TEST_F(Zel_PropertyListTest, TraceFormJoinsElementsWithNewlines)
 TEST(Zel_PropertyKeysTest, SpellTheServersKeysExactly)
 {
     const std::vector<std::pair<const QString*, const char*>> keys = {
-        { &Zel_PropKey_Name, "Name" },
-        { &Zel_PropKey_MobID, "MobID" },
-        { &Zel_PropKey_Duration, "Duration" },
-        { &Zel_PropKey_Tape, "Tape" },
-        { &Zel_PropKey_TapeID, "TapeID" },
-        { &Zel_PropKey_ModifiedDate, "ModifiedDate" },
-        { &Zel_PropKey_Tracks, "Tracks" },
-        { &Zel_PropKey_Comments, "Comments" },
-        { &Zel_PropKey_MimeType, "Mime Type" },
-        { &Zel_PropKey_OmmMobComplete, "_OMM_MOB_COMPLETE" },
+        { &Zel_PropKey_Name, "Name" }, { &Zel_PropKey_MobID, "MobID" },
+        { &Zel_PropKey_Duration, "Duration" }, { &Zel_PropKey_Tape, "Tape" },
+        { &Zel_PropKey_TapeID, "TapeID" }, { &Zel_PropKey_ModifiedDate, "ModifiedDate" },
+        { &Zel_PropKey_Tracks, "Tracks" }, { &Zel_PropKey_Comments, "Comments" },
+        { &Zel_PropKey_MimeType, "Mime Type" }, { &Zel_PropKey_OmmMobComplete, "_OMM_MOB_COMPLETE" },
         { &Zel_PropKey_EwcExpectedDur, "_EWC_EXPECTED_DUR" },
         { &Zel_PropKey_EwcKnownMediaDur, "_EWC_KNOWN_MEDIA_DUR" },
-        { &Zel_PropKey_QmOffsetToSource, "_QM_OFFSET_TO_SOURCE" },
-        { &Zel_PropKey_QmSourceMobID, "_QM_SOURCE_MOBID" },
-        { &Zel_PropKey_QmTrackInfo, "_QM_TRACK_INFO" },
-        { &Zel_PropKey_MetadataType, "MetadataType" },
-        { &Zel_PropKey_Frame, "Frame" },
-        { &Zel_PropKey_MarkIN, "MarkIN" },
-        { &Zel_PropKey_MarkOUT, "MarkOUT" },
-        { &Zel_PropKey_KopWorkgroupStatus, "KOP_Workgroup_Status" },
-        { &Zel_PropKey_Position, "Position" },
-        { &Zel_PropKey_Start, "Start" },
-        { &Zel_PropKey_CreationDate, "CreationDate" },
-        { &Zel_PropKey_SCRT, "SCRT" },
-        { &Zel_PropKey_SMOT, "SMOT" },
-        { &Zel_PropKey_SCIT, "SCIT" },
-        { &Zel_PropKey_SIMT, "SIMT" },
-        { &Zel_PropKey_CategoryValues, "Category_Values" },
-        { &Zel_PropKey_Category, "Category" },
-        { &Zel_PropKey_LocatorAnnotationValues, "LocatorAnnotationValues" },
-        { &Zel_PropKey_StoryID, "Story_ID" },
-        { &Zel_PropKey_ReviewSequence, "ReviewSequence" },
-        { &Zel_PropKey_Path, "Path" },
-        { &Zel_PropKey_KopServerAuthOwner, "KopServer_AuthOwner" },
+        { &Zel_PropKey_QmOffsetToSource, "_QM_OFFSET_TO_SOURCE" }, { &Zel_PropKey_QmSourceMobID, "_QM_SOURCE_MOBID" },
+        { &Zel_PropKey_QmTrackInfo, "_QM_TRACK_INFO" }, { &Zel_PropKey_MetadataType, "MetadataType" },
+        { &Zel_PropKey_Frame, "Frame" }, { &Zel_PropKey_MarkIN, "MarkIN" },
+        { &Zel_PropKey_MarkOUT, "MarkOUT" }, { &Zel_PropKey_KopWorkgroupStatus, "KOP_Workgroup_Status" },
+        { &Zel_PropKey_Position, "Position" }, { &Zel_PropKey_Start, "Start" },
+        { &Zel_PropKey_CreationDate, "CreationDate" }, { &Zel_PropKey_SCRT, "SCRT" },
+        { &Zel_PropKey_SMOT, "SMOT" }, { &Zel_PropKey_SCIT, "SCIT" },
+        { &Zel_PropKey_SIMT, "SIMT" }, { &Zel_PropKey_CategoryValues, "Category_Values" },
+        { &Zel_PropKey_Category, "Category" }, { &Zel_PropKey_LocatorAnnotationValues, "LocatorAnnotationValues" },
+        { &Zel_PropKey_StoryID, "Story_ID" }, { &Zel_PropKey_ReviewSequence, "ReviewSequence" },
+        { &Zel_PropKey_Path, "Path" }, { &Zel_PropKey_KopServerAuthOwner, "KopServer_AuthOwner" },
         { &Zel_PropKey_KopServerWGContainsDRMClip, "KopServer_WG_ContainsDRMClip" },
-        { &Zel_PropKey_CustomList, "CustomList" },
-        { &Zel_PropKey_CreatedBy, "Created By" },
-        { &Zel_PropKey_AppliedDefaults, "AppliedDefaults" },
-        { &Zel_PropKey_DurationTC, "_DurationTC_" },
-        { &Zel_PropKey_VersionNumber, "VersionNumber" },
-        { &Zel_PropKey_LockedBy, "Locked By" },
-        { &Zel_PropKey_LockedOn, "Locked On" },
-        { &Zel_PropKey_Color, "Color" },
+        { &Zel_PropKey_CustomList, "CustomList" }, { &Zel_PropKey_CreatedBy, "Created By" },
+        { &Zel_PropKey_AppliedDefaults, "AppliedDefaults" }, { &Zel_PropKey_DurationTC, "_DurationTC_" },
+        { &Zel_PropKey_VersionNumber, "VersionNumber" }, { &Zel_PropKey_LockedBy, "Locked By" },
+        { &Zel_PropKey_LockedOn, "Locked On" }, { &Zel_PropKey_Color, "Color" },
         { &Zel_PropKey_SyncedProjectGUID, "SyncedProject_GUID" },
         { &Zel_PropKey_SyncedProjectType, "SyncedProject_Type" },
         { &Zel_MasterAndSonarisSequence, "Master and Sonaris Sequence" },
@@ -396,13 +344,10 @@ TEST(Zel_PropertyKeysTest, SpellTheServersKeysExactly)
 
 TEST(Zel_PropertyManagerTest, VirtualSlotsKeepTheirOrder)
 {
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getDisplayName), 2);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getIsModifiable), 3);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getIsAvailable), 4);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getInternalName), 5);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getIsType), 6);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getIsTextSearchable), 7);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getHasCustomValues), 8);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getKeys), 9);
-    EXPECT_EQ(vtableSlot(&Zel_PropertyManager::getKeyByDisplayName), 10);
+#define ROW(member) ZEL_SLOT_ROW(Zel_PropertyManager, member)
+    EXPECT_EQ(slotsOutOfOrder(2, {ROW(getDisplayName), ROW(getIsModifiable), ROW(getIsAvailable), ROW(getInternalName),
+                                  ROW(getIsType), ROW(getIsTextSearchable), ROW(getHasCustomValues), ROW(getKeys),
+                                  ROW(getKeyByDisplayName)}),
+              "");
+#undef ROW
 }

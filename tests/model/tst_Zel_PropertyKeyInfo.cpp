@@ -30,52 +30,42 @@ const char* const kDuplicateTapeNo =
 
 } // namespace
 
-TEST(Zel_PropertyKeyInfoTest, RendersFieldsFlagsAndType)
+TEST(Zel_PropertyKeyInfoTest, RendersFieldsFlagsAndTypeAndIsValidWithAllThreeNames)
 {
-    const Zel_PropertyKeyInfo tape(QStringLiteral("Tape"), QStringLiteral("Tape Name"), true, false,
-                                   QStringLiteral("tape"), static_cast<Zel_PropertyKeyType>(3), true, false);
+    const Zel_PropertyKeyInfo tape = info("Tape", "Tape Name", "tape");
     EXPECT_EQ(str(tape.toZelString()), "Zel_PropertyKeyInfo(Tape:Tape Name:tape:T:F:3:T:F)");
     const Zel_PropertyKeyInfo other(QStringLiteral("k"), QStringLiteral("d"), false, true, QStringLiteral("i"),
                                     static_cast<Zel_PropertyKeyType>(-12), false, true);
     EXPECT_EQ(str(other.toZelString()), "Zel_PropertyKeyInfo(k:d:i:F:T:-12:F:T)");
-
-    const Zel_PropertyKeyInfo empty;
-    EXPECT_EQ(str(empty.toZelString()), "Zel_PropertyKeyInfo(:::F:F:0:F:F)");
-    EXPECT_FALSE(empty.isValid());
-    EXPECT_TRUE(empty.isType(Zel_PropertyKeyType_None));
-
+    EXPECT_EQ(str(Zel_PropertyKeyInfo().toZelString()), "Zel_PropertyKeyInfo(:::F:F:0:F:F)");
+    EXPECT_TRUE(Zel_PropertyKeyInfo().isType(Zel_PropertyKeyType_None));
     EXPECT_TRUE(tape.isType(Zel_PropertyKeyType_AlternateResolution));
     EXPECT_FALSE(tape.isType(Zel_PropertyKeyType_Resolution));
-    EXPECT_TRUE(tape.isModifiable());
-    EXPECT_FALSE(tape.isAvailable());
-    EXPECT_TRUE(tape.isTextSearchable());
-    EXPECT_FALSE(tape.hasCustomValues());
-}
 
-TEST(Zel_PropertyKeyInfoTest, ValidNeedsKeyDisplayAndInternalName)
-{
-    EXPECT_TRUE(info("k", "d", "i").isValid());
-    EXPECT_FALSE(info("", "d", "i").isValid());
-    EXPECT_FALSE(info("k", "", "i").isValid());
-    EXPECT_FALSE(info("k", "d", "").isValid());
+    EXPECT_TRUE(tape.isValid());
+    for (const Zel_PropertyKeyInfo& invalid :
+         {Zel_PropertyKeyInfo(), info("", "d", "i"), info("k", "", "i"), info("k", "d", "")})
+        EXPECT_FALSE(invalid.isValid()) << str(invalid.toZelString());
+    EXPECT_EQ(vtableSlot(&Zel_PropertyKeyInfo::toZelString), 2);
 }
 
 TEST(Zel_PropertyKeyInfoTest, EqualityComparesAllEightFields)
 {
-    const Zel_PropertyKeyInfo base(QStringLiteral("k"), QStringLiteral("d"), true, true, QStringLiteral("i"),
-                                   Zel_PropertyKeyType_Resolution, true, true);
+    const auto make = [](const char* key, const char* display, bool modifiable, bool available, const char* internal,
+                         Zel_PropertyKeyType type, bool searchable, bool custom) {
+        return Zel_PropertyKeyInfo(QString::fromLatin1(key), QString::fromLatin1(display), modifiable, available,
+                                   QString::fromLatin1(internal), type, searchable, custom);
+    };
+    const Zel_PropertyKeyType res = Zel_PropertyKeyType_Resolution, alt = Zel_PropertyKeyType_AlternateResolution;
+    const Zel_PropertyKeyInfo base = make("k", "d", true, true, "i", res, true, true);
     Zel_PropertyKeyInfo copy(base);
     EXPECT_TRUE(copy == base);
     EXPECT_FALSE(copy != base);
     const std::vector<Zel_PropertyKeyInfo> variants = {
-        Zel_PropertyKeyInfo(QStringLiteral("K"), QStringLiteral("d"), true, true, QStringLiteral("i"), Zel_PropertyKeyType_Resolution, true, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("D"), true, true, QStringLiteral("i"), Zel_PropertyKeyType_Resolution, true, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("d"), false, true, QStringLiteral("i"), Zel_PropertyKeyType_Resolution, true, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("d"), true, false, QStringLiteral("i"), Zel_PropertyKeyType_Resolution, true, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("d"), true, true, QStringLiteral("I"), Zel_PropertyKeyType_Resolution, true, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("d"), true, true, QStringLiteral("i"), Zel_PropertyKeyType_AlternateResolution, true, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("d"), true, true, QStringLiteral("i"), Zel_PropertyKeyType_Resolution, false, true),
-        Zel_PropertyKeyInfo(QStringLiteral("k"), QStringLiteral("d"), true, true, QStringLiteral("i"), Zel_PropertyKeyType_Resolution, true, false),
+        make("K", "d", true, true, "i", res, true, true),  make("k", "D", true, true, "i", res, true, true),
+        make("k", "d", false, true, "i", res, true, true), make("k", "d", true, false, "i", res, true, true),
+        make("k", "d", true, true, "I", res, true, true),  make("k", "d", true, true, "i", alt, true, true),
+        make("k", "d", true, true, "i", res, false, true), make("k", "d", true, true, "i", res, true, false),
     };
     for (const Zel_PropertyKeyInfo& variant : variants) {
         EXPECT_FALSE(variant == base) << str(variant.toZelString());
@@ -85,30 +75,24 @@ TEST(Zel_PropertyKeyInfoTest, EqualityComparesAllEightFields)
     EXPECT_TRUE(copy == variants[5]);
 }
 
-TEST(Zel_PropertyKeyInfoTest, VirtualSlotsKeepTheirOrder)
+TEST(Zel_PropertyKeyInfoListTest, FirstValidWinsAndADifferingDuplicateIsTracedOnlyWhileTracingIsOn)
 {
-    EXPECT_EQ(vtableSlot(&Zel_PropertyKeyInfo::toZelString), 2);
-}
-
-TEST(Zel_PropertyKeyInfoListTest, SameDescriptionTwiceKeepsOneEntrySilently)
-{
-    TraceCapture capture;
-    Zel_PropertyKeyInfoList list;
-    list.addIfKeyNotInList(info("Tape", "Tape Name", "tape"));
-    // Same names, other fields differ: ignored without a trace line; the first stays.
-    list.push_back(info("Tape", "Tape Name", "tape", 7, false));
-    EXPECT_EQ(list.size(), 1);
-    EXPECT_EQ(str(list.toZelString()), "Zel_PropertyKeyInfo(Tape:Tape Name:tape:T:F:3:T:F)");
-    EXPECT_TRUE(capture.orvLines().empty());
-    EXPECT_TRUE(capture.qtLines().isEmpty());
-}
-
-TEST(Zel_PropertyKeyInfoListTest, FirstValidWinsAndDuplicateIsTraced)
-{
+    {
+        TraceCapture capture(false);
+        Zel_PropertyKeyInfoList list;
+        list.addIfKeyNotInList(info("Tape", "Tape Name", "tape"));
+        list.addIfKeyNotInList(info("Tape", "Tape No.", "tape"));
+        EXPECT_TRUE(capture.orvLines().empty());
+        EXPECT_EQ(list.size(), 1);
+    }
     TraceCapture capture;
     Zel_PropertyKeyInfoList list;
     const Zel_PropertyKeyInfo first = info("Tape", "Tape Name", "tape");
     list.addIfKeyNotInList(first);
+    // The same description again, other fields differing: kept once, silently.
+    list.push_back(info("Tape", "Tape Name", "tape", 7, false));
+    EXPECT_EQ(str(list.toZelString()), "Zel_PropertyKeyInfo(Tape:Tape Name:tape:T:F:3:T:F)");
+    EXPECT_TRUE(capture.orvLines().empty() && capture.qtLines().isEmpty());
     list.addIfKeyNotInList(info("Tape", "Tape No.", "tape"));
 
     EXPECT_TRUE(list.findByKey(QStringLiteral("Tape")) == first);
@@ -127,17 +111,7 @@ TEST(Zel_PropertyKeyInfoListTest, FirstValidWinsAndDuplicateIsTraced)
     EXPECT_FALSE(list.findByInternalName(QStringLiteral("tape2")).isValid());
 }
 
-TEST(Zel_PropertyKeyInfoListTest, DuplicateWritesNothingWhileTracingIsOff)
-{
-    TraceCapture capture(false);
-    Zel_PropertyKeyInfoList list;
-    list.addIfKeyNotInList(info("Tape", "Tape Name", "tape"));
-    list.addIfKeyNotInList(info("Tape", "Tape No.", "tape"));
-    EXPECT_TRUE(capture.orvLines().empty());
-    EXPECT_EQ(list.size(), 1);
-}
-
-TEST(Zel_PropertyKeyInfoListTest, ByNameIndexesHoldTheLastAccepted)
+TEST(Zel_PropertyKeyInfoListTest, ByNameIndexesHoldTheLastAcceptedAndKeepTheRowsOfAReplacedInvalidEntry)
 {
     Zel_PropertyKeyInfoList list;
     const Zel_PropertyKeyInfo a = info("A", "Shown", "intA");
@@ -150,23 +124,18 @@ TEST(Zel_PropertyKeyInfoListTest, ByNameIndexesHoldTheLastAccepted)
     EXPECT_TRUE(list.findByInternalName(QStringLiteral("intA")) == a);
     EXPECT_FALSE(list.findByDisplayName(QStringLiteral("shown")).isValid()); // case-sensitive
     EXPECT_FALSE(list.findByKey(QStringLiteral("a")).isValid());
-}
 
-TEST(Zel_PropertyKeyInfoListTest, InvalidEntryIsReplacedButItsOldRowsStay)
-{
-    Zel_PropertyKeyInfoList list;
     const Zel_PropertyKeyInfo invalid = info("Tape", "Old Display", "");
     const Zel_PropertyKeyInfo valid = info("Tape", "Tape Name", "tape");
     list.addIfKeyNotInList(invalid);
     EXPECT_TRUE(list.findByKey(QStringLiteral("Tape")) == invalid);
     EXPECT_TRUE(list.findByInternalName(QString()) == invalid);
-
     list.addIfKeyNotInList(valid);
     EXPECT_TRUE(list.findByKey(QStringLiteral("Tape")) == valid);
     EXPECT_TRUE(list.findByInternalName(QStringLiteral("tape")) == valid);
     EXPECT_TRUE(list.findByInternalName(QString()) == invalid);
     EXPECT_TRUE(list.findByDisplayName(QStringLiteral("Old Display")) == invalid);
-    EXPECT_EQ(list.size(), 1);
+    EXPECT_EQ(list.size(), 3);
 }
 
 TEST(Zel_PropertyKeyInfoListTest, LookupsNeverAddAndRenderingIsByAscendingKey)
@@ -181,8 +150,7 @@ TEST(Zel_PropertyKeyInfoListTest, LookupsNeverAddAndRenderingIsByAscendingKey)
                            "Zel_PropertyKeyInfo(Name:Name:name:T:F:3:T:F)\n"
                            "Zel_PropertyKeyInfo(Tape:Tape Name:tape:T:F:3:T:F)");
 
-    const Zel_PropertyKeyInfo absent = list.findByKey(QStringLiteral("Absent"));
-    EXPECT_TRUE(absent == Zel_PropertyKeyInfo());
+    EXPECT_TRUE(list.findByKey(QStringLiteral("Absent")) == Zel_PropertyKeyInfo());
     list.findByInternalName(QStringLiteral("absent"));
     list.findByDisplayName(QStringLiteral("Absent"));
     EXPECT_EQ(list.toZelString(), before);
@@ -195,7 +163,6 @@ TEST(Zel_PropertyKeyInfoListTest, LookupsNeverAddAndRenderingIsByAscendingKey)
 
     Zel_PropertyKeyInfoList copy(list);
     list.clear();
-    EXPECT_TRUE(list.isEmpty());
     EXPECT_FALSE(list.findByDisplayName(QStringLiteral("Mark In")).isValid());
     EXPECT_FALSE(list.findByInternalName(QStringLiteral("markin")).isValid());
     EXPECT_EQ(copy.toZelString(), before);
