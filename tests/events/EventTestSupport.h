@@ -59,24 +59,19 @@ private:
 class RecordingListener : public Zel_EventListener
 {
 public:
-    RecordingListener(EventLog* log, const QString& name, boost::shared_ptr<QString> key,
-                      unsigned long mask = 7, boost::shared_ptr<Zel_Session> session = boost::shared_ptr<Zel_Session>())
-        : Zel_EventListener(key, mask, session)
-        , mLog(log)
-        , mName(name)
+    RecordingListener(EventLog* log, const QString& name, boost::shared_ptr<QString> key, unsigned long mask = 7,
+                      boost::shared_ptr<Zel_Session> session = boost::shared_ptr<Zel_Session>())
+        : Zel_EventListener(key, mask, session), mLog(log), mName(name)
     {
     }
-
-    // Runs inside handleEvent, before the event is logged.
-    std::function<void(RecordingListener&)> onEvent;
-    // Runs in the destructor.
-    std::function<void()> onDestroy;
-
     ~RecordingListener() override
     {
         if (onDestroy)
             onDestroy();
     }
+
+    std::function<void(RecordingListener&)> onEvent; // runs inside handleEvent, before the event is logged
+    std::function<void()> onDestroy;                  // runs in the destructor
 
     using Zel_EventListener::getMoniker;
     using Zel_EventListener::getSessionSP;

@@ -10,13 +10,8 @@ namespace {
 
 // Exposes the protected and private slots for slot pinning; adds one virtual
 // after the base's six so that its position shows how many the base has.
-class SlotProbe : public Zel_EventListener
-{
-public:
-    SlotProbe()
-        : Zel_EventListener(boost::shared_ptr<QString>(), 0, boost::shared_ptr<Zel_Session>())
-    {
-    }
+struct SlotProbe : Zel_EventListener {
+    SlotProbe() : Zel_EventListener(boost::shared_ptr<QString>(), 0, boost::shared_ptr<Zel_Session>()) {}
     void handleEvent(boost::shared_ptr<Zel_Event>) override {}
     boost::shared_ptr<QString> getMoniker() override { return Zel_EventListener::getMoniker(); }
     bool isEnabled(boost::shared_ptr<Zel_Event> event) const override { return Zel_EventListener::isEnabled(event); }
@@ -26,20 +21,14 @@ public:
 };
 
 // A listener whose kind accepts only child-removed events.
-class RemovedOnlyListener : public RecordingListener
-{
-public:
-    RemovedOnlyListener()
-        : RecordingListener(nullptr, QStringLiteral("r"), boost::shared_ptr<QString>(), 0)
-    {
-    }
-protected:
+struct RemovedOnlyListener : RecordingListener {
+    RemovedOnlyListener() : RecordingListener(nullptr, QStringLiteral("r"), boost::shared_ptr<QString>(), 0) {}
     const unsigned long getValidEventMask() const override { return 2; }
 };
 
 } // namespace
 
-TEST(Zel_EventListenerTest, EnableIgnoresTypesOutsideValidMaskButOneSharedBitSetsEveryBit)
+TEST(Zel_EventListenerTest, EnableIgnoresTypesOutsideValidMaskOneSharedBitSetsEveryBitAndIsEnabledNeedsASharedBit)
 {
     RecordingListener listener(nullptr, QStringLiteral("l"), moniker("m"), 0);
     EXPECT_EQ(listener.enableEvent(8), 0ul);      // no bit shared with 7
@@ -51,32 +40,25 @@ TEST(Zel_EventListenerTest, EnableIgnoresTypesOutsideValidMaskButOneSharedBitSet
     EXPECT_EQ(listener += 4, 5ul);
     EXPECT_EQ(listener -= 1, 4ul);
     EXPECT_EQ(listener -= 64, 4ul);
-}
 
-TEST(Zel_EventListenerTest, ConstructorKeepsMaskUnchecked)
-{
     // The initial mask is stored as given, even bits the kind cannot accept.
-    RecordingListener listener(nullptr, QStringLiteral("l"), moniker("m"), 8 | 2);
-    EXPECT_EQ(listener.enableEvent(0), 10ul);
+    RecordingListener unchecked(nullptr, QStringLiteral("l"), moniker("m"), 8 | 2);
+    EXPECT_EQ(unchecked.enableEvent(0), 10ul);
     RemovedOnlyListener removedOnly;
     EXPECT_EQ(removedOnly.enableEvent(1), 0ul);
     EXPECT_EQ(removedOnly.enableEvent(3), 3ul);
-}
 
-TEST(Zel_EventListenerTest, IsEnabledNeedsAnEventSharingABitWithTheEnabledMask)
-{
-    RecordingListener listener(nullptr, QStringLiteral("l"), moniker("m"), 0);
+    // isEnabled needs an event sharing a bit with the enabled mask.
+    RecordingListener listener2(nullptr, QStringLiteral("l"), moniker("m"), 0);
     const boost::shared_ptr<Zel_Event> added = addedEvent("m", "c");
     const boost::shared_ptr<Zel_Event> removed(new Zel_EventChildRemoved(moniker("m"), moniker("c")));
-
-    EXPECT_FALSE(listener.isEnabled(boost::shared_ptr<Zel_Event>()));
-    EXPECT_FALSE(listener.isEnabled(added));   // mask 0 accepts nothing
-    listener.enableEvent(2);
-    EXPECT_FALSE(listener.isEnabled(added));
-    EXPECT_TRUE(listener.isEnabled(removed));
-    listener.enableEvent(1);
-    EXPECT_TRUE(listener.isEnabled(added));
-    EXPECT_FALSE(listener.isEnabled(boost::shared_ptr<Zel_Event>()));
+    EXPECT_FALSE(listener2.isEnabled(boost::shared_ptr<Zel_Event>()) || listener2.isEnabled(added));
+    listener2.enableEvent(2);
+    EXPECT_FALSE(listener2.isEnabled(added));
+    EXPECT_TRUE(listener2.isEnabled(removed));
+    listener2.enableEvent(1);
+    EXPECT_TRUE(listener2.isEnabled(added));
+    EXPECT_FALSE(listener2.isEnabled(boost::shared_ptr<Zel_Event>()));
 }
 
 TEST(Zel_EventListenerTest, CopyKeepsMaskSessionAndMonikerButIsNotOwned)
@@ -139,12 +121,10 @@ TEST(Zel_EventListenerTest, RegisterWithSessionWorksOnceASharedPointerOwnsTheLis
 
 TEST(Zel_EventListenerTest, VirtualSlotOrderIsFixed)
 {
-    EXPECT_EQ(vtableSlot(&SlotProbe::handleEvent), 2);
-    EXPECT_EQ(vtableSlot(&SlotProbe::getMoniker), 3);
-    EXPECT_EQ(vtableSlot(&SlotProbe::isEnabled), 4);
-    EXPECT_EQ(vtableSlot(&SlotProbe::getValidEventMask), 5);
-    EXPECT_EQ(vtableSlot(&SlotProbe::getEnabledEventMask), 6);
-    EXPECT_EQ(vtableSlot(&SlotProbe::firstNewSlot), 7);
+    EXPECT_EQ(slotsOutOfOrder(2, {ZEL_SLOT_ROW(SlotProbe, handleEvent), ZEL_SLOT_ROW(SlotProbe, getMoniker),
+                                  ZEL_SLOT_ROW(SlotProbe, isEnabled), ZEL_SLOT_ROW(SlotProbe, getValidEventMask),
+                                  ZEL_SLOT_ROW(SlotProbe, getEnabledEventMask), ZEL_SLOT_ROW(SlotProbe, firstNewSlot)}),
+              "");
     EXPECT_TRUE((std::is_base_of<QList<boost::shared_ptr<Zel_EventListener>>, Zel_EventListenerSPList>::value));
     EXPECT_TRUE(std::has_virtual_destructor<Zel_EventListenerSPList>::value);
 }

@@ -10,39 +10,38 @@ namespace {
 class Zel_NodeListenerTest : public ::testing::Test
 {
 protected:
-    boost::shared_ptr<RecordingListener> listener(const QString& name, boost::shared_ptr<QString> key)
+    // A registered listener under the key (nullptr: an empty key pointer).
+    boost::shared_ptr<RecordingListener> listener(const char* name, const char* key)
     {
-        boost::shared_ptr<RecordingListener> l(new RecordingListener(&log, name, key, 7, session));
+        boost::shared_ptr<RecordingListener> l(new RecordingListener(
+            &log, QString::fromLatin1(name), key ? moniker(key) : boost::shared_ptr<QString>(), 7, session));
         session->RegisterListener(l);
         return l;
     }
 
     boost::shared_ptr<StubSession> session{new StubSession};
     boost::shared_ptr<Orv_ResultQ> queue{new Orv_ResultQ};
+    Zel_NodeListener nodes{session->getEventCBSP(), queue};
     EventLog log;
 };
 
 } // namespace
 
-TEST_F(Zel_NodeListenerTest, PushesNothingWithoutAnInterestedListener)
+TEST_F(Zel_NodeListenerTest, PushesOnlyForAnInterestedListenerAndTheResultsDeliverThroughTheHub)
 {
-    Zel_NodeListener nodes(session->getEventCBSP(), queue);
     nodes.NodeAdded(moniker("/a"), moniker("/a/1"));
     nodes.NodeRemoved(moniker("/a"), moniker("/a/1"));
-    EXPECT_EQ(queue->Size(), 0u);
-
-    listener(QStringLiteral("b"), moniker("/b"));
+    listener("b", "/b");
     nodes.NodeAdded(moniker("/a"), moniker("/a/1"));
     EXPECT_EQ(queue->Size(), 0u);
     nodes.NodeAdded(moniker("/b"), moniker("/b/1"));
     EXPECT_EQ(queue->Size(), 1u);
-}
+    queue->TryPop()->deliverNext();
+    EXPECT_EQ(log.lines(), QStringList({"b:Zel_EventChildAdded parent: /b child: /b/1"}));
+    log.clear();
 
-TEST_F(Zel_NodeListenerTest, PushedResultsDeliverTheEventsThroughTheHub)
-{
-    Zel_NodeListener nodes(session->getEventCBSP(), queue);
-    listener(QStringLiteral("all"), boost::shared_ptr<QString>());
-    listener(QStringLiteral("a"), moniker("/a"));
+    listener("all", nullptr);
+    listener("a", "/a");
 
     nodes.NodeAdded(moniker("/a"), moniker("/a/1"));
     nodes.NodeRemoved(moniker("/z"), moniker("/z/9"));
@@ -64,21 +63,20 @@ TEST_F(Zel_NodeListenerTest, PushedResultsDeliverTheEventsThroughTheHub)
 
 TEST_F(Zel_NodeListenerTest, KeyThatLostItsListenersStillPushesAndReceiversAreResolvedAtDelivery)
 {
-    Zel_NodeListener nodes(session->getEventCBSP(), queue);
-    const boost::shared_ptr<RecordingListener> a = listener(QStringLiteral("a"), moniker("/a"));
+    const boost::shared_ptr<RecordingListener> a = listener("a", "/a");
     session->UnregisterListener(a);
     nodes.NodeRemoved(moniker("/a"), moniker("/a/1"));
     EXPECT_EQ(queue->Size(), 1u);
 
     // Registered after the report, before the delivery: it still hears it.
-    listener(QStringLiteral("late"), moniker("/a"));
+    listener("late", "/a");
     queue->TryPop()->deliverNext();
     EXPECT_EQ(log.lines(), QStringList({"late:Zel_EventChildRemoved parent: /a child: /a/1"}));
 }
 
 TEST_F(Zel_NodeListenerTest, NullHubOrQueueIgnoresReportsAndTheListenerKeepsTheHubAlive)
 {
-    listener(QStringLiteral("all"), boost::shared_ptr<QString>());
+    listener("all", nullptr);
     Zel_NodeListener noHub(boost::shared_ptr<Zel_EventCB>(), queue);
     noHub.NodeAdded(moniker("/a"), moniker("/a/1"));
     Zel_NodeListener noQueue(session->getEventCBSP(), boost::shared_ptr<Orv_ResultQ>());
@@ -86,7 +84,6 @@ TEST_F(Zel_NodeListenerTest, NullHubOrQueueIgnoresReportsAndTheListenerKeepsTheH
     noQueue.NodeRemoved(moniker("/a"), moniker("/a/1"));
     EXPECT_EQ(queue->Size(), 0u);
 
-    Zel_NodeListener nodes(session->getEventCBSP(), queue);
     Zel_NodeListener copy(nodes);
     const boost::weak_ptr<Zel_EventCB> watch = session->getEventCBSP();
     session.reset();
