@@ -13,7 +13,7 @@
 //                                      "" listeners answer; none: a hub without "" listeners
 //   hub/QMap-lookups/<case>            the same contains() calls on an unlocked QMap (floor)
 //   hub/locked-QMap-lookups/<case>     the same under a std::recursive_mutex (peer)
-#include "BenchSession.h"
+#include "StubSession.h"
 #include "BenchSupport.h"
 
 #include "Zel_Event.h"
@@ -74,7 +74,7 @@ boost::shared_ptr<QString> otherMoniker(int i)
 struct HubFixture
 {
     HubFixture(int folderListeners, bool everyNodeListeners)
-        : session(boost::make_shared<BenchSession>())
+        : session(boost::make_shared<StubSession>())
         , moniker(folderMoniker())
     {
         for (int i = 0; i < kOtherFolders; ++i)
@@ -100,7 +100,7 @@ struct HubFixture
         return total;
     }
 
-    boost::shared_ptr<BenchSession> session;
+    boost::shared_ptr<StubSession> session;
     boost::shared_ptr<QString> moniker;
     boost::shared_ptr<Zel_EventCB> hub;
     std::vector<boost::shared_ptr<CountingListener>> inOrder;

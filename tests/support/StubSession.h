@@ -1,4 +1,4 @@
-// Test support: a session whose backend operations do nothing, so that the
+// Test and benchmark support: a session whose backend operations do nothing, so that the
 // shared part of Zel_Session (hub, registration, flags, name rules) can be tested.
 #ifndef ZEL_TESTS_STUBSESSION_H
 #define ZEL_TESTS_STUBSESSION_H
