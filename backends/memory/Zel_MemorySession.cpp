@@ -125,6 +125,10 @@
 #include "Zel_SetUserSettingsReq.h"
 #include "Zel_StartupReq.h"
 
+#include <iterator>
+#include <mutex>
+#include <vector>
+
 namespace {
 
 const char* const kRequestNames[] = {
@@ -155,6 +159,40 @@ Zel_ResolutionIDList resolutionsOf(const boost::shared_ptr<Zel_MemoryTree>& tree
     return list;
 }
 
+// The property managers of the live sessions, oldest first. The newest live
+// session's manager is the registered one; when a session goes, the
+// registration falls back to the newest session still alive, so that another
+// session (on the same tree or another) keeps its key descriptions.
+std::mutex gManagersMutex;
+
+std::vector<boost::shared_ptr<Zel_PropertyManager>>& liveManagers()
+{
+    static std::vector<boost::shared_ptr<Zel_PropertyManager>> managers;
+    return managers;
+}
+
+void registerManager(const boost::shared_ptr<Zel_PropertyManager>& manager)
+{
+    std::lock_guard<std::mutex> lock(gManagersMutex);
+    liveManagers().push_back(manager);
+    Zel_Property::setPropertyManagerSP(manager);
+}
+
+void unregisterManager(const boost::shared_ptr<Zel_PropertyManager>& manager)
+{
+    std::lock_guard<std::mutex> lock(gManagersMutex);
+    std::vector<boost::shared_ptr<Zel_PropertyManager>>& managers = liveManagers();
+    for (auto it = managers.rbegin(); it != managers.rend(); ++it) {
+        if (*it == manager) {
+            managers.erase(std::next(it).base());
+            break;
+        }
+    }
+    // An application's own manager, registered later, stays.
+    if (Zel_Property::getPropertyManagerSP() == manager)
+        Zel_Property::setPropertyManagerSP(managers.empty() ? boost::shared_ptr<Zel_PropertyManager>() : managers.back());
+}
+
 } // namespace
 
 Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tree, Orv_Engine* engine,
@@ -173,7 +211,7 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ));
     mState->tree->data().addObserver(mObserver);
     mPropertyManager = mState->tree->data().propertyManager;
-    Zel_Property::setPropertyManagerSP(mPropertyManager);
+    registerManager(mPropertyManager);
 }
 
 Zel_MemorySession::~Zel_MemorySession()
@@ -182,8 +220,7 @@ Zel_MemorySession::~Zel_MemorySession()
     mState->closed = true;
     mState->setOwner(nullptr);
     mState->tree->data().removeObserver(mObserver.get());
-    if (Zel_Property::getPropertyManagerSP() == mPropertyManager)
-        Zel_Property::setPropertyManagerSP(boost::shared_ptr<Zel_PropertyManager>());
+    unregisterManager(mPropertyManager);
 }
 
 // --- The connection and the session's state -----------------------------------

@@ -22,7 +22,8 @@
 // reservations, locators and media as child updated.
 //
 // The tree's property manager is registered (Zel_Property::setPropertyManagerSP)
-// for the session's life. simulateConnectionLoss() and simulateReconnect()
+// for the session's life; while several sessions live, the newest one's is.
+// simulateConnectionLoss() and simulateReconnect()
 // play a dropped connection: the status callback hears disconnected() and
 // connected(), and requests fail with NotConnected in between.
 //

@@ -608,3 +608,27 @@ TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
     EXPECT_FALSE(session->makeGetNodeReqSP(mk(m(Mayor)), rec<NodeRec>()));
     EXPECT_FALSE(session->submitRequest(boost::shared_ptr<Orv_Request>()));
 }
+
+TEST_F(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives)
+{
+    const boost::shared_ptr<Zel_PropertyManager> own = Zel_Property::getPropertyManagerSP();
+    ASSERT_TRUE(own);
+    EXPECT_EQ(QStringLiteral("Tape Name"), Zel_Property::getDisplayName(QStringLiteral("Tape")));
+
+    // A second session on the same tree comes and goes: the first keeps its manager.
+    newSession(QStringLiteral("assistant")).reset();
+    EXPECT_EQ(own, Zel_Property::getPropertyManagerSP());
+    EXPECT_EQ(QStringLiteral("Tape Name"), Zel_Property::getDisplayName(QStringLiteral("Tape")));
+
+    // A session on another tree takes over while it lives and hands back after.
+    {
+        Zel_MemorySession other(Zel_MemoryTree::sample(), &engine, QStringLiteral("other"));
+        EXPECT_NE(own, Zel_Property::getPropertyManagerSP());
+        EXPECT_TRUE(Zel_Property::getPropertyManagerSP());
+    }
+    EXPECT_EQ(own, Zel_Property::getPropertyManagerSP());
+
+    session.reset();
+    engine.DeliverAll();
+    EXPECT_FALSE(Zel_Property::getPropertyManagerSP());
+}
