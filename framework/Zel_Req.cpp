@@ -7,8 +7,10 @@
 #include "Orv_ResultQ.h"
 #include "Orv_ResultsCB.h"
 
+// The engine's name is Latin-1, the encoding getName() and the trace log read
+// it in (QString::toStdString() gives UTF-8 since Qt 5).
 Zel_Req::Zel_Req(QString name, boost::shared_ptr<Orv_ResultsCB> callback)
-    : Orv_Request(name.toStdString(), std::move(callback))
+    : Orv_Request(name.toLatin1().toStdString(), std::move(callback))
 {
 }
 

@@ -114,6 +114,22 @@ TEST(Zel_ReqTest, EmptyQueueSkipsWorkButStillTracesAndAnEmptyNameLeavesTheSource
     EXPECT_GT(unnamed.getRequestID().getValue(), request.getRequestID().getValue());
 }
 
+TEST(Zel_ReqTest, LatinOneNameComesBackFromGetNameAndReachesTheTraceUnchanged)
+{
+    // getName() reads the engine's name as Latin-1, so the name must be stored as
+    // Latin-1 too: a UTF-8 copy would come back with two characters for the e-acute.
+    TraceCapture capture;
+    const QString name = QStringLiteral("Z") + QChar(0xE9) + QStringLiteral("l");
+    ScriptedReq request(name, [](boost::shared_ptr<Orv_Result>&) { return true; });
+    EXPECT_EQ(request.getName(), name);
+    EXPECT_EQ(request.name(), std::string("Z\xE9l"));
+
+    request.process(boost::make_shared<Orv_ResultQ>());
+    const std::vector<std::string> lines = capture.orvLines();
+    ASSERT_EQ(lines.size(), 2u);
+    EXPECT_EQ(lines[0], "ZEL: Z\xE9l: processing request" + idText(request));
+}
+
 TEST(Zel_ReqTest, WorkWithoutResultPushesNothingPassesItsAnswerAndRunsAgainOnANewQueue)
 {
     TraceCapture capture(false);
