@@ -429,8 +429,9 @@ void GetReservationsOp::run(Work& work, const Args& args, Result& result)
 {
     ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
-    // The holder and the end of the node's reservation; no answer when free.
-    if (!node.reservation.user.isEmpty())
+    // The holder and the end of the node's reservation; no answer when free
+    // (never reserved, released, or expired).
+    if (node.reservation.isActive())
         result.setResult(node.reservation.user, node.reservation.until, ok());
 }
 ZEL_MEMORY_EXECUTE(GetReservationsOp)

@@ -290,9 +290,11 @@ boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n)
     s.mimeType = n.mimeType;
     s.mobID = n.mobId;
     s.path = tree.pathOf(n);
-    s.reservedBy = n.reservation.user;
-    s.reservedSince = n.reservation.since;
-    s.reservedUntil = n.reservation.until;
+    if (n.reservation.isActive()) { // an expired reservation holds nothing
+        s.reservedBy = n.reservation.user;
+        s.reservedSince = n.reservation.since;
+        s.reservedUntil = n.reservation.until;
+    }
     for (const Node* p = &n; p; p = tree.parentOf(*p)) {
         if (p->mimeType == QLatin1String("project") && !tree.propertyValue(*p, QStringLiteral("SyncedProject_GUID")).isEmpty()) {
             s.syncedProject = true;

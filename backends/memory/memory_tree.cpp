@@ -84,7 +84,7 @@ Zel_PropertyList nodeProperties(const Tree& tree, const Node& node)
         list.append(Zel_Property(QStringLiteral("MobID"), node.mobId, QString()));
     for (const Property& p : node.properties)
         list.append(Zel_Property(p.key, p.value, p.customValues));
-    if (!node.reservation.user.isEmpty()) {
+    if (node.reservation.isActive()) {
         list.addIfKeyNotInList(Zel_Property(QStringLiteral("Locked By"), node.reservation.user, QString()));
         if (node.reservation.since.isValid())
             list.addIfKeyNotInList(Zel_Property(QStringLiteral("Locked On"), node.reservation.since.toString(Qt::ISODate), QString()));

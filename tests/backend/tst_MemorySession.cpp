@@ -632,3 +632,35 @@ TEST_F(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives
     engine.DeliverAll();
     EXPECT_FALSE(Zel_Property::getPropertyManagerSP());
 }
+
+TEST_F(Zel_MemorySessionTest, ExpiredReservationIsReportedAsFree)
+{
+    // The sample tree with the bulletin's reservation run out in the past.
+    QByteArray json = Zel_MemoryTree::sampleJson();
+    const QByteArray held("\"reservation\": { \"user\": \"producer\", \"since\": \"2026-03-02T11:00:00Z\" }");
+    ASSERT_TRUE(json.contains(held));
+    json.replace(held, "\"reservation\": { \"user\": \"producer\", \"since\": \"2020-01-01T09:00:00Z\", "
+                       "\"until\": \"2020-01-01T10:00:00Z\" }");
+    QString error;
+    tree = Zel_MemoryTree::fromJson(json, QStringLiteral("expired.json"), &error);
+    ASSERT_TRUE(tree) << error.toStdString();
+    session = newSession();
+
+    auto get = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Bulletin)), get));
+    ASSERT_EQ(1, get->nodes.size());
+    EXPECT_FALSE(get->nodes[0]->isReserved());
+    EXPECT_TRUE(get->nodes[0]->getPropertyValue(QStringLiteral("Locked By")).isEmpty());
+
+    auto reservations = rec<ReservationsRec>();
+    run(session->makeGetReservationsReqSP(mk(m(Bulletin)), reservations));
+    EXPECT_EQ(QStringList{QStringLiteral("finished")}, reservations->log);
+
+    // The answers agree with what the server enforces: the node is free to change.
+    auto release = rec<RemoveReservationRec>();
+    run(session->makeRemoveReservationReqSP(mk(m(Bulletin)), release));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotReserved}, release->codes);
+    auto reserve = rec<CreateReservationRec>();
+    run(session->makeCreateReservationReqSP(mk(m(Bulletin)), QDateTime(), reserve));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), reserve->log);
+}
