@@ -1,17 +1,21 @@
 #include "Orv.h"
 
+#include <memory>
 #include <mutex>
 
 namespace {
-std::mutex& logMutex()
+// Recursive: a handler may log, or install another handler, on its own thread.
+std::recursive_mutex& logMutex()
 {
-    static std::mutex mutex;
+    static std::recursive_mutex mutex;
     return mutex;
 }
 
-Orv::LogHandler& logHandler()
+// The installed handler, replaced whole by setLogHandler; log() keeps its own
+// reference during the call, so a handler that replaces itself stays alive.
+std::shared_ptr<const Orv::LogHandler>& logHandler()
 {
-    static Orv::LogHandler handler;
+    static std::shared_ptr<const Orv::LogHandler> handler;
     return handler;
 }
 } // namespace
@@ -20,15 +24,21 @@ void Orv::log(const char* line)
 {
     if (!line)
         return;
-    std::lock_guard<std::mutex> lock(logMutex());
-    if (logHandler())
-        logHandler()(line);
+    // The lock is held through the call: once setLogHandler() has returned on
+    // any thread, the handler it replaced is not running and can be destroyed.
+    std::lock_guard<std::recursive_mutex> lock(logMutex());
+    const std::shared_ptr<const LogHandler> handler = logHandler();
+    if (handler && *handler)
+        (*handler)(line);
 }
 
 Orv::LogHandler Orv::setLogHandler(LogHandler handler)
 {
-    std::lock_guard<std::mutex> lock(logMutex());
-    LogHandler previous = std::move(logHandler());
-    logHandler() = std::move(handler);
-    return previous;
+    std::shared_ptr<const LogHandler> installed;
+    if (handler)
+        installed = std::make_shared<const LogHandler>(std::move(handler));
+    std::lock_guard<std::recursive_mutex> lock(logMutex());
+    const std::shared_ptr<const LogHandler> previous = std::move(logHandler());
+    logHandler() = std::move(installed);
+    return previous ? *previous : LogHandler();
 }

@@ -168,8 +168,19 @@ TEST(Orv_EngineTest, LogWithoutHandlerDiscardsAndHandlerCanBeReplaced)
     std::vector<std::string> seen;
     Orv::setLogHandler([&](const char* line) { seen.push_back(line); });
     Orv::log("kept");
-    Orv::setLogHandler(previous);
     EXPECT_EQ(seen, (std::vector<std::string>{"kept"}));
+
+    // A handler may log itself and replace itself while it runs.
+    seen.clear();
+    Orv::setLogHandler([&](const char* line) {
+        seen.push_back(std::string("first:") + line);
+        Orv::setLogHandler([&](const char* inner) { seen.push_back(std::string("second:") + inner); });
+        Orv::log("from the handler");
+    });
+    Orv::log("outer");
+    Orv::log("after");
+    Orv::setLogHandler(previous);
+    EXPECT_EQ(seen, (std::vector<std::string>{"first:outer", "second:from the handler", "second:after"}));
 }
 
 TEST(Orv_EngineTest, DestroyingEngineWithQueuedWorkJoinsCleanly)
