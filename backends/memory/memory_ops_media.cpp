@@ -120,7 +120,7 @@ void CheckinOp::run(Work& work, const Args& args, Result& result)
             continue;
         }
         QString name = QFileInfo(file).completeBaseName();
-        if (name.isEmpty() || !work.session.isValidAssetName(name))
+        if (name.isEmpty() || name.size() > MaxNameLength || !work.session.isValidAssetName(name))
             name = QStringLiteral("Clip ") + mobID.right(8);
         Node node;
         node.id = work.tree.newNodeId();

@@ -105,8 +105,6 @@ private:
     std::vector<boost::weak_ptr<Cancelable>> mRequests;
 };
 
-const int MaxNameLength = 128;
-
 // The context of one request's work.
 class Work
 {

@@ -221,7 +221,8 @@ QString Tree::uniqueChildName(const Node& parent, const QString& name) const
     if (!childNamed(parent, name))
         return name;
     for (int n = 2;; ++n) {
-        const QString candidate = name + QLatin1Char(' ') + QString::number(n);
+        const QString suffix = QLatin1Char(' ') + QString::number(n);
+        const QString candidate = name.left(qMax(0, MaxNameLength - suffix.size())) + suffix;
         if (!childNamed(parent, candidate))
             return candidate;
     }

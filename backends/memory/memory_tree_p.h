@@ -40,6 +40,9 @@ class Zel_MemoryPropertyManager;
 
 namespace ZelMemory {
 
+// The longest asset name the server accepts, in UTF-16 code units.
+const int MaxNameLength = 128;
+
 // The thirty permission flags of Zel_NodePermissions, one bit each, in the
 // order of that class.
 enum Permission : std::uint32_t {
@@ -235,7 +238,8 @@ public:
     const Node* reservedByOther(const Node& node, const QString& user, bool below = true) const;
     // The child of parent named name (exact), or null.
     const Node* childNamed(const Node& parent, const QString& name) const;
-    // name, or "name 2", "name 3", ... whichever no child of parent has.
+    // name, or "name 2", "name 3", ... whichever no child of parent has; the
+    // name is shortened where the number would make it longer than the limit.
     QString uniqueChildName(const Node& parent, const QString& name) const;
     // The value of a stored property (Name and Mime Type included).
     QString propertyValue(const Node& node, const QString& key) const;

@@ -664,3 +664,36 @@ TEST_F(Zel_MemorySessionTest, ExpiredReservationIsReportedAsFree)
     run(session->makeCreateReservationReqSP(mk(m(Bulletin)), QDateTime(), reserve));
     EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), reserve->log);
 }
+
+TEST_F(Zel_MemorySessionTest, NamesTheServerMakesStayWithinTheNameLimit)
+{
+    const QString longest(session->getMaxNameLength(), QLatin1Char('x'));
+    auto first = rec<CreateFolderUniqueRec>();
+    run(session->makeCreateFolderUniqueReqSP(mk(m(Footage)), longest, first));
+    ASSERT_EQ(1, first->nodes.size());
+    EXPECT_EQ(longest, first->nodes[0]->getName());
+
+    // The number that makes the second name unique replaces its end.
+    auto second = rec<CreateFolderUniqueRec>();
+    run(session->makeCreateFolderUniqueReqSP(mk(m(Footage)), longest, second));
+    ASSERT_EQ(1, second->nodes.size());
+    EXPECT_EQ(QString(session->getMaxNameLength() - 2, QLatin1Char('x')) + QStringLiteral(" 2"), second->nodes[0]->getName());
+
+    // A media file whose name is too long arrives under a generated name.
+    Zel_MobDescList mobs;
+    mobs.add(Zel_MobDesc(QString(), QStringLiteral("/ingest/") + QString(200, QLatin1Char('y')) + QStringLiteral(".mxf"), QString()));
+    auto checkin = rec<CheckinRec>();
+    run(session->makeCheckinReqSP(mobs, mk(m(Footage)), checkin));
+    ASSERT_EQ(1, checkin->nodes.size());
+    ASSERT_TRUE(checkin->nodes[0]);
+    EXPECT_LE(checkin->nodes[0]->getName().size(), session->getMaxNameLength());
+    EXPECT_TRUE(checkin->nodes[0]->getName().startsWith(QStringLiteral("Clip ")));
+
+    // Every name the server made passes its own name rules (renaming a node
+    // to its own name checks the name and changes nothing).
+    for (const NodeSP& node : {second->nodes[0], checkin->nodes[0]}) {
+        auto rename = rec<RenameNodeRec>();
+        run(session->makeRenameNodeReqSP(mk(node->getMoniker()), node->getName(), rename));
+        EXPECT_TRUE(rename->codes.isEmpty()) << node->getName().toStdString();
+    }
+}
