@@ -222,7 +222,7 @@ QString Tree::uniqueChildName(const Node& parent, const QString& name) const
         return name;
     for (int n = 2;; ++n) {
         const QString suffix = QLatin1Char(' ') + QString::number(n);
-        const QString candidate = name.left(qMax(0, MaxNameLength - suffix.size())) + suffix;
+        const QString candidate = name.left(qMax(0, MaxNameLength - static_cast<int>(suffix.size()))) + suffix;
         if (!childNamed(parent, candidate))
             return candidate;
     }
