@@ -28,32 +28,13 @@ Zel_CheckinRes::~Zel_CheckinRes() = default;
 
 bool Zel_CheckinRes::deliverNext()
 {
-    try {
-        if (mCallback && mCursor < mItems.size()) {
-            // The cursor moves before the handler runs: a handler that throws
-            // has still had its item.
-            const ListItem& item = mItems[static_cast<std::size_t>(mCursor++)];
-            try {
-                if (ZelResults::reportsError(item.mError))
-                    mCallback->failed(item.mMobDesc, item.mError);
-                else
-                    mCallback->succeeded(item.mMobDesc, item.mNode, item.mText);
-            } catch (...) {
-                // Discarded: the remaining items and the end notice still follow.
-            }
-            if (mCursor < mItems.size())
-                return true;
-        }
-        if (mCallback && isFinalResult()) {
-            try {
-                mCallback->finished();
-            } catch (...) {
-            }
-        }
-    } catch (...) {
-        // Nothing thrown inside delivery passes to the engine.
-    }
-    return false;
+    return ZelResults::deliverListItem(*this, mCallback, mItems, mCursor,
+                                       [](Zel_CheckinCB& callback, const ListItem& item) {
+                                           if (ZelResults::reportsError(item.mError))
+                                               callback.failed(item.mMobDesc, item.mError);
+                                           else
+                                               callback.succeeded(item.mMobDesc, item.mNode, item.mText);
+                                       });
 }
 
 void Zel_CheckinRes::addItem(boost::shared_ptr<Zel_MobDesc> mobDesc, boost::shared_ptr<Zel_Node> node,

@@ -24,32 +24,13 @@ Zel_CheckinUpdateRes::~Zel_CheckinUpdateRes() = default;
 
 bool Zel_CheckinUpdateRes::deliverNext()
 {
-    try {
-        if (mCallback && mCursor < mItems.size()) {
-            // The cursor moves before the handler runs: a handler that throws
-            // has still had its item.
-            const ListItem& item = mItems[static_cast<std::size_t>(mCursor++)];
-            try {
-                if (ZelResults::reportsError(item.mError))
-                    mCallback->failed(item.mError);
-                else
-                    mCallback->succeeded();
-            } catch (...) {
-                // Discarded: the remaining items and the end notice still follow.
-            }
-            if (mCursor < mItems.size())
-                return true;
-        }
-        if (mCallback && isFinalResult()) {
-            try {
-                mCallback->finished();
-            } catch (...) {
-            }
-        }
-    } catch (...) {
-        // Nothing thrown inside delivery passes to the engine.
-    }
-    return false;
+    return ZelResults::deliverListItem(*this, mCallback, mItems, mCursor,
+                                       [](Zel_CheckinUpdateCB& callback, const ListItem& item) {
+                                           if (ZelResults::reportsError(item.mError))
+                                               callback.failed(item.mError);
+                                           else
+                                               callback.succeeded();
+                                       });
 }
 
 void Zel_CheckinUpdateRes::addItem(boost::shared_ptr<Zel_Error> error)

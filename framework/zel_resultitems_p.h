@@ -3,6 +3,7 @@
 #ifndef ZEL_RESULTITEMS_P_H
 #define ZEL_RESULTITEMS_P_H
 
+#include "Orv_Result.h"
 #include "Zel_Error.h"
 
 #include <boost/make_shared.hpp>
@@ -24,6 +25,37 @@ inline boost::shared_ptr<Zel_Error> errorRecord(boost::shared_ptr<Zel_Error> err
 inline bool reportsError(const boost::shared_ptr<Zel_Error>& error)
 {
     return error && error->isError();
+}
+
+// One deliverNext() call of the check-in results, which keep their own list
+// of items: hands the item at the cursor to deliver(item), then, after the
+// last item of a final result, calls finished(). The cursor moves before the
+// handler runs, and an exception from a handler (or from finished()) is
+// discarded, so the remaining items and the end notice still follow. True
+// while items remain; nothing thrown here reaches the engine.
+template <class Callback, class Items, class Cursor, class Deliver>
+bool deliverListItem(const Orv_Result& result, const boost::shared_ptr<Callback>& callback, const Items& items,
+                     Cursor& cursor, Deliver deliver)
+{
+    try {
+        if (callback && cursor < items.size()) {
+            const auto& item = items[static_cast<std::size_t>(cursor++)];
+            try {
+                deliver(*callback, item);
+            } catch (...) {
+            }
+            if (cursor < items.size())
+                return true;
+        }
+        if (callback && result.isFinalResult()) {
+            try {
+                callback->finished();
+            } catch (...) {
+            }
+        }
+    } catch (...) {
+    }
+    return false;
 }
 
 } // namespace ZelResults
