@@ -38,10 +38,10 @@ public:
 
     void read(const QJsonObject& top)
     {
-        const QString format = optString(top, QStringLiteral("format"), QStringLiteral("format"), QString());
+        const QString format = optString(top, QStringLiteral("format"), QString(), QString());
         if (!format.isEmpty() && format != QLatin1String(kFormat))
             fail(QStringLiteral("format"), QStringLiteral("expected \"%1\", found \"%2\"").arg(QLatin1String(kFormat), format));
-        mTree.serverName = optString(top, QStringLiteral("server"), QStringLiteral("server"), QStringLiteral("Zel Memory Server"));
+        mTree.serverName = optString(top, QStringLiteral("server"), QString(), QStringLiteral("Zel Memory Server"));
         readUsers(top);
         readKeys(top);
         readResolutions(top);
@@ -62,76 +62,76 @@ private:
         throw Failure{mSource + QStringLiteral(": ") + path + QStringLiteral(": ") + message};
     }
 
-    QString optString(const QJsonObject& object, const QString& key, const QString& path, const QString& fallback)
+    QString optString(const QJsonObject& object, const QString& key, const QString& parent, const QString& fallback)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
             return fallback;
         if (!value.isString())
-            fail(path, QStringLiteral("expected a string"));
+            fail(fieldPath(parent, key), QStringLiteral("expected a string"));
         return value.toString();
     }
 
-    QString reqString(const QJsonObject& object, const QString& key, const QString& path)
+    QString reqString(const QJsonObject& object, const QString& key, const QString& parent)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined())
-            fail(path, QStringLiteral("missing"));
+            fail(fieldPath(parent, key), QStringLiteral("missing"));
         if (!value.isString())
-            fail(path, QStringLiteral("expected a string"));
+            fail(fieldPath(parent, key), QStringLiteral("expected a string"));
         if (value.toString().isEmpty())
-            fail(path, QStringLiteral("must not be empty"));
+            fail(fieldPath(parent, key), QStringLiteral("must not be empty"));
         return value.toString();
     }
 
-    bool optBool(const QJsonObject& object, const QString& key, const QString& path, bool fallback)
+    bool optBool(const QJsonObject& object, const QString& key, const QString& parent, bool fallback)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
             return fallback;
         if (!value.isBool())
-            fail(path, QStringLiteral("expected true or false"));
+            fail(fieldPath(parent, key), QStringLiteral("expected true or false"));
         return value.toBool();
     }
 
-    int optInt(const QJsonObject& object, const QString& key, const QString& path, int fallback)
+    int optInt(const QJsonObject& object, const QString& key, const QString& parent, int fallback)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
             return fallback;
         if (!value.isDouble() || value.toDouble() != static_cast<double>(value.toInt()))
-            fail(path, QStringLiteral("expected a whole number"));
+            fail(fieldPath(parent, key), QStringLiteral("expected a whole number"));
         return value.toInt();
     }
 
-    QDateTime optDate(const QJsonObject& object, const QString& key, const QString& path)
+    QDateTime optDate(const QJsonObject& object, const QString& key, const QString& parent)
     {
-        const QString text = optString(object, key, path, QString());
+        const QString text = optString(object, key, parent, QString());
         if (text.isEmpty())
             return QDateTime();
         QDateTime date = QDateTime::fromString(text, Qt::ISODate);
         if (!date.isValid())
-            fail(path, QStringLiteral("\"%1\" is not an ISO 8601 date and time").arg(text));
+            fail(fieldPath(parent, key), QStringLiteral("\"%1\" is not an ISO 8601 date and time").arg(text));
         return date.toUTC();
     }
 
-    QJsonArray optArray(const QJsonObject& object, const QString& key, const QString& path)
+    QJsonArray optArray(const QJsonObject& object, const QString& key, const QString& parent)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
             return QJsonArray();
         if (!value.isArray())
-            fail(path, QStringLiteral("expected an array"));
+            fail(fieldPath(parent, key), QStringLiteral("expected an array"));
         return value.toArray();
     }
 
-    QJsonObject optObject(const QJsonObject& object, const QString& key, const QString& path)
+    QJsonObject optObject(const QJsonObject& object, const QString& key, const QString& parent)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
             return QJsonObject();
         if (!value.isObject())
-            fail(path, QStringLiteral("expected an object"));
+            fail(fieldPath(parent, key), QStringLiteral("expected an object"));
         return value.toObject();
     }
 
@@ -144,6 +144,8 @@ private:
 
     static QString at(const QString& path, int i) { return path + QLatin1Char('[') + QString::number(i) + QLatin1Char(']'); }
     static QString dot(const QString& path, const QString& key) { return path + QLatin1Char('.') + key; }
+    // The path of a member: its key alone at the top, otherwise parent.key.
+    static QString fieldPath(const QString& parent, const QString& key) { return parent.isEmpty() ? key : dot(parent, key); }
 
     SettingPairs readPairs(const QJsonObject& object, const QString& path)
     {
@@ -158,54 +160,54 @@ private:
 
     void readUsers(const QJsonObject& top)
     {
-        const QJsonArray users = optArray(top, QStringLiteral("users"), QStringLiteral("users"));
+        const QJsonArray users = optArray(top, QStringLiteral("users"), QString());
         for (int i = 0; i < users.size(); ++i) {
             const QString path = at(QStringLiteral("users"), i);
             const QJsonObject o = element(users, i, path);
             User user;
-            user.name = reqString(o, QStringLiteral("name"), dot(path, QStringLiteral("name")));
+            user.name = reqString(o, QStringLiteral("name"), path);
             if (user.name == QLatin1String("*"))
                 fail(dot(path, QStringLiteral("name")), QStringLiteral("\"*\" stands for every user and cannot be a user's name"));
             if (mTree.user(user.name))
                 fail(dot(path, QStringLiteral("name")), QStringLiteral("a second user named \"%1\"").arg(user.name));
-            user.password = optString(o, QStringLiteral("password"), dot(path, QStringLiteral("password")), QString());
-            user.fullName = optString(o, QStringLiteral("fullName"), dot(path, QStringLiteral("fullName")), user.name);
-            user.admin = optBool(o, QStringLiteral("admin"), dot(path, QStringLiteral("admin")), false);
+            user.password = optString(o, QStringLiteral("password"), path, QString());
+            user.fullName = optString(o, QStringLiteral("fullName"), path, user.name);
+            user.admin = optBool(o, QStringLiteral("admin"), path, false);
             mTree.users.append(user);
         }
     }
 
     void readKeys(const QJsonObject& top)
     {
-        const QJsonArray keys = optArray(top, QStringLiteral("propertyKeys"), QStringLiteral("propertyKeys"));
+        const QJsonArray keys = optArray(top, QStringLiteral("propertyKeys"), QString());
         for (int i = 0; i < keys.size(); ++i) {
             const QString path = at(QStringLiteral("propertyKeys"), i);
             const QJsonObject o = element(keys, i, path);
             KeyDesc key;
-            key.key = reqString(o, QStringLiteral("key"), dot(path, QStringLiteral("key")));
+            key.key = reqString(o, QStringLiteral("key"), path);
             if (mTree.key(key.key))
                 fail(dot(path, QStringLiteral("key")), QStringLiteral("a second description of the key \"%1\"").arg(key.key));
-            key.displayName = optString(o, QStringLiteral("displayName"), dot(path, QStringLiteral("displayName")), key.key);
-            key.internalName = optString(o, QStringLiteral("internalName"), dot(path, QStringLiteral("internalName")), key.key);
-            key.modifiable = optBool(o, QStringLiteral("modifiable"), dot(path, QStringLiteral("modifiable")), true);
-            key.available = optBool(o, QStringLiteral("available"), dot(path, QStringLiteral("available")), true);
-            key.type = optInt(o, QStringLiteral("type"), dot(path, QStringLiteral("type")), 1);
-            key.textSearchable = optBool(o, QStringLiteral("textSearchable"), dot(path, QStringLiteral("textSearchable")), true);
-            key.hasCustomValues = optBool(o, QStringLiteral("customValues"), dot(path, QStringLiteral("customValues")), false);
+            key.displayName = optString(o, QStringLiteral("displayName"), path, key.key);
+            key.internalName = optString(o, QStringLiteral("internalName"), path, key.key);
+            key.modifiable = optBool(o, QStringLiteral("modifiable"), path, true);
+            key.available = optBool(o, QStringLiteral("available"), path, true);
+            key.type = optInt(o, QStringLiteral("type"), path, 1);
+            key.textSearchable = optBool(o, QStringLiteral("textSearchable"), path, true);
+            key.hasCustomValues = optBool(o, QStringLiteral("customValues"), path, false);
             mTree.keys.append(key);
         }
     }
 
     void readResolutions(const QJsonObject& top)
     {
-        const QJsonArray list = optArray(top, QStringLiteral("resolutions"), QStringLiteral("resolutions"));
+        const QJsonArray list = optArray(top, QStringLiteral("resolutions"), QString());
         for (int i = 0; i < list.size(); ++i) {
             const QString path = at(QStringLiteral("resolutions"), i);
             const QJsonObject o = element(list, i, path);
             Resolution r;
-            r.label = reqString(o, QStringLiteral("label"), dot(path, QStringLiteral("label")));
-            r.id = reqString(o, QStringLiteral("id"), dot(path, QStringLiteral("id")));
-            r.type = optInt(o, QStringLiteral("type"), dot(path, QStringLiteral("type")), 2);
+            r.label = reqString(o, QStringLiteral("label"), path);
+            r.id = reqString(o, QStringLiteral("id"), path);
+            r.type = optInt(o, QStringLiteral("type"), path, 2);
             if (r.type != 2 && r.type != 3)
                 fail(dot(path, QStringLiteral("type")), QStringLiteral("expected 2 (video) or 3 (audio)"));
             mTree.resolutions.append(r);
@@ -215,18 +217,18 @@ private:
     void readSettings(const QJsonObject& top)
     {
         const QString base = QStringLiteral("settings");
-        const QJsonObject settings = optObject(top, base, base);
-        mTree.workgroupSettings = readPairs(optObject(settings, QStringLiteral("workgroup"), dot(base, QStringLiteral("workgroup"))),
+        const QJsonObject settings = optObject(top, base, QString());
+        mTree.workgroupSettings = readPairs(optObject(settings, QStringLiteral("workgroup"), base),
                                             dot(base, QStringLiteral("workgroup")));
         const QString appsPath = dot(base, QStringLiteral("applications"));
-        const QJsonObject apps = optObject(settings, QStringLiteral("applications"), appsPath);
+        const QJsonObject apps = optObject(settings, QStringLiteral("applications"), base);
         for (auto it = apps.begin(); it != apps.end(); ++it) {
             if (!it.value().isObject())
                 fail(dot(appsPath, it.key()), QStringLiteral("expected an object"));
             mTree.applicationSettings.insert(it.key(), readPairs(it.value().toObject(), dot(appsPath, it.key())));
         }
         const QString usersPath = dot(base, QStringLiteral("users"));
-        const QJsonObject users = optObject(settings, QStringLiteral("users"), usersPath);
+        const QJsonObject users = optObject(settings, QStringLiteral("users"), base);
         for (auto it = users.begin(); it != users.end(); ++it) {
             const QString userPath = dot(usersPath, it.key());
             if (!mTree.user(it.key()))
@@ -248,7 +250,7 @@ private:
             mTree.userSettings.insert(it.key(), byType);
         }
         const QString docsPath = dot(base, QStringLiteral("documents"));
-        const QJsonObject docs = optObject(settings, QStringLiteral("documents"), docsPath);
+        const QJsonObject docs = optObject(settings, QStringLiteral("documents"), base);
         for (auto it = docs.begin(); it != docs.end(); ++it) {
             if (!it.value().isString())
                 fail(dot(docsPath, it.key()), QStringLiteral("expected a string"));
@@ -259,13 +261,13 @@ private:
     QList<Marker> readMarkers(const QJsonObject& o, const QString& key, const QString& path)
     {
         QList<Marker> markers;
-        const QJsonArray list = optArray(o, key, dot(path, key));
+        const QJsonArray list = optArray(o, key, path);
         for (int i = 0; i < list.size(); ++i) {
             const QString p = at(dot(path, key), i);
             const QJsonObject m = element(list, i, p);
             Marker marker;
-            marker.id = reqString(m, QStringLiteral("id"), dot(p, QStringLiteral("id")));
-            marker.properties = readPairs(optObject(m, QStringLiteral("properties"), dot(p, QStringLiteral("properties"))),
+            marker.id = reqString(m, QStringLiteral("id"), p);
+            marker.properties = readPairs(optObject(m, QStringLiteral("properties"), p),
                                           dot(p, QStringLiteral("properties")));
             markers.append(marker);
         }
@@ -275,31 +277,31 @@ private:
     Node& readNode(const QJsonObject& o, const QString& path, Node* parent)
     {
         Node node;
-        node.id = optString(o, QStringLiteral("id"), dot(path, QStringLiteral("id")), QString());
+        node.id = optString(o, QStringLiteral("id"), path, QString());
         if (node.id.isEmpty())
             node.id = mTree.newNodeId();
         if (mTree.byId(node.id))
             fail(dot(path, QStringLiteral("id")), QStringLiteral("a second node with the ID \"%1\"").arg(node.id));
-        node.moniker = optString(o, QStringLiteral("moniker"), dot(path, QStringLiteral("moniker")), kMonikerPrefix + node.id);
+        node.moniker = optString(o, QStringLiteral("moniker"), path, kMonikerPrefix + node.id);
         if (node.moniker.isEmpty())
             fail(dot(path, QStringLiteral("moniker")), QStringLiteral("must not be empty"));
         if (mTree.idByMoniker.contains(node.moniker))
             fail(dot(path, QStringLiteral("moniker")), QStringLiteral("a second node with the moniker \"%1\"").arg(node.moniker));
-        node.name = reqString(o, QStringLiteral("name"), dot(path, QStringLiteral("name")));
-        node.mimeType = reqString(o, QStringLiteral("mimeType"), dot(path, QStringLiteral("mimeType")));
+        node.name = reqString(o, QStringLiteral("name"), path);
+        node.mimeType = reqString(o, QStringLiteral("mimeType"), path);
         Zel_MimeTypeValue mimeValue;
         if (!Zel_MimeTypeSpec::getType(node.mimeType, mimeValue))
             fail(dot(path, QStringLiteral("mimeType")), QStringLiteral("unknown mime type \"%1\"").arg(node.mimeType));
         if (parent && !Zel_MimeTypeSpec(0x7E00).isType(parent->mimeType))
             fail(path, QStringLiteral("the parent \"%1\" is a %2, which cannot hold children").arg(parent->name, parent->mimeType));
-        node.mobId = optString(o, QStringLiteral("mobID"), dot(path, QStringLiteral("mobID")), QString());
-        node.masterMoniker = optString(o, QStringLiteral("master"), dot(path, QStringLiteral("master")), QString());
-        node.userPlaced = optBool(o, QStringLiteral("userPlaced"), dot(path, QStringLiteral("userPlaced")), true);
-        node.created = optDate(o, QStringLiteral("created"), dot(path, QStringLiteral("created")));
-        node.modified = optDate(o, QStringLiteral("modified"), dot(path, QStringLiteral("modified")));
+        node.mobId = optString(o, QStringLiteral("mobID"), path, QString());
+        node.masterMoniker = optString(o, QStringLiteral("master"), path, QString());
+        node.userPlaced = optBool(o, QStringLiteral("userPlaced"), path, true);
+        node.created = optDate(o, QStringLiteral("created"), path);
+        node.modified = optDate(o, QStringLiteral("modified"), path);
 
         const QString propsPath = dot(path, QStringLiteral("properties"));
-        const QJsonObject props = optObject(o, QStringLiteral("properties"), propsPath);
+        const QJsonObject props = optObject(o, QStringLiteral("properties"), path);
         for (auto it = props.begin(); it != props.end(); ++it) {
             Property p;
             p.key = it.key();
@@ -309,8 +311,8 @@ private:
                 p.value = it.value().toString();
             } else if (it.value().isObject()) {
                 const QJsonObject po = it.value().toObject();
-                p.value = optString(po, QStringLiteral("value"), dot(dot(propsPath, p.key), QStringLiteral("value")), QString());
-                p.customValues = optString(po, QStringLiteral("customValues"), dot(dot(propsPath, p.key), QStringLiteral("customValues")), QString());
+                p.value = optString(po, QStringLiteral("value"), dot(propsPath, p.key), QString());
+                p.customValues = optString(po, QStringLiteral("customValues"), dot(propsPath, p.key), QString());
             } else {
                 fail(dot(propsPath, p.key), QStringLiteral("expected a string or an object with \"value\" and \"customValues\""));
             }
@@ -318,17 +320,17 @@ private:
         }
 
         const QString resPath = dot(path, QStringLiteral("reservation"));
-        const QJsonObject reservation = optObject(o, QStringLiteral("reservation"), resPath);
+        const QJsonObject reservation = optObject(o, QStringLiteral("reservation"), path);
         if (!reservation.isEmpty()) {
-            node.reservation.user = reqString(reservation, QStringLiteral("user"), dot(resPath, QStringLiteral("user")));
+            node.reservation.user = reqString(reservation, QStringLiteral("user"), resPath);
             if (!mTree.user(node.reservation.user))
                 fail(dot(resPath, QStringLiteral("user")), QStringLiteral("no user is named \"%1\"").arg(node.reservation.user));
-            node.reservation.since = optDate(reservation, QStringLiteral("since"), dot(resPath, QStringLiteral("since")));
-            node.reservation.until = optDate(reservation, QStringLiteral("until"), dot(resPath, QStringLiteral("until")));
+            node.reservation.since = optDate(reservation, QStringLiteral("since"), resPath);
+            node.reservation.until = optDate(reservation, QStringLiteral("until"), resPath);
         }
 
         const QString permPath = dot(path, QStringLiteral("permissions"));
-        const QJsonObject permissions = optObject(o, QStringLiteral("permissions"), permPath);
+        const QJsonObject permissions = optObject(o, QStringLiteral("permissions"), path);
         for (auto it = permissions.begin(); it != permissions.end(); ++it) {
             const QString p = dot(permPath, it.key());
             if (it.key() != QLatin1String("*") && !mTree.user(it.key()))
@@ -351,24 +353,24 @@ private:
         node.locators = readMarkers(o, QStringLiteral("locators"), path);
         node.restrictions = readMarkers(o, QStringLiteral("restrictions"), path);
 
-        const QJsonArray deps = optArray(o, QStringLiteral("dependencies"), dot(path, QStringLiteral("dependencies")));
+        const QJsonArray deps = optArray(o, QStringLiteral("dependencies"), path);
         for (int i = 0; i < deps.size(); ++i) {
             const QString p = at(dot(path, QStringLiteral("dependencies")), i);
             const QJsonObject d = element(deps, i, p);
             Dependency dep;
-            dep.moniker = reqString(d, QStringLiteral("moniker"), dot(p, QStringLiteral("moniker")));
-            dep.usage = optString(d, QStringLiteral("usage"), dot(p, QStringLiteral("usage")), QString());
-            dep.type = optInt(d, QStringLiteral("type"), dot(p, QStringLiteral("type")), 0);
+            dep.moniker = reqString(d, QStringLiteral("moniker"), p);
+            dep.usage = optString(d, QStringLiteral("usage"), p, QString());
+            dep.type = optInt(d, QStringLiteral("type"), p, 0);
             node.dependencies.append(dep);
         }
 
-        const QJsonArray media = optArray(o, QStringLiteral("media"), dot(path, QStringLiteral("media")));
+        const QJsonArray media = optArray(o, QStringLiteral("media"), path);
         for (int i = 0; i < media.size(); ++i) {
             const QString p = at(dot(path, QStringLiteral("media")), i);
             const QJsonObject m = element(media, i, p);
             Media file;
-            file.path = reqString(m, QStringLiteral("path"), dot(p, QStringLiteral("path")));
-            file.resolution = optString(m, QStringLiteral("resolution"), dot(p, QStringLiteral("resolution")), QString());
+            file.path = reqString(m, QStringLiteral("path"), p);
+            file.resolution = optString(m, QStringLiteral("resolution"), p, QString());
             node.media.append(file);
         }
 
@@ -382,7 +384,7 @@ private:
         }
         mPaths.insert(stored->id, path);
 
-        const QJsonArray children = optArray(o, QStringLiteral("children"), dot(path, QStringLiteral("children")));
+        const QJsonArray children = optArray(o, QStringLiteral("children"), path);
         for (int i = 0; i < children.size(); ++i) {
             const QString p = at(dot(path, QStringLiteral("children")), i);
             const QJsonObject child = element(children, i, p);
@@ -412,7 +414,7 @@ private:
 
     void readLinkedProjects(const QJsonObject& top)
     {
-        const QJsonArray list = optArray(top, QStringLiteral("linkedProjects"), QStringLiteral("linkedProjects"));
+        const QJsonArray list = optArray(top, QStringLiteral("linkedProjects"), QString());
         for (int i = 0; i < list.size(); ++i) {
             const QString path = at(QStringLiteral("linkedProjects"), i);
             if (!list.at(i).isString())
