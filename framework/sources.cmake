@@ -1,0 +1,38 @@
+# Sources of the request framework: trace log, errors, requests, results, callbacks.
+set(ZEL_FRAMEWORK_SOURCES
+  Zel_AddDependencyRes.cpp
+  Zel_AssociationsRes.cpp
+  Zel_Callbacks.cpp
+  Zel_CheckinRes.cpp
+  Zel_CheckinUpdateRes.cpp
+  Zel_ChildrenRes.cpp
+  Zel_CreateFolderUniqueRes.cpp
+  Zel_CreateNodeUniqueRes.cpp
+  Zel_CreateReservationRes.cpp
+  Zel_Debug.cpp
+  Zel_DeleteNodeRes.cpp
+  Zel_DeleteRes.cpp
+  Zel_Error.cpp
+  Zel_GetApplicationSettingsRes.cpp
+  Zel_GetChildrenRes.cpp
+  Zel_GetLinkedProjectsRes.cpp
+  Zel_GetNodeRes.cpp
+  Zel_GetReservationsRes.cpp
+  Zel_GetSyncedProjRootRes.cpp
+  Zel_GetUserSettingsRes.cpp
+  Zel_MediaResolutionsRes.cpp
+  Zel_Message.cpp
+  Zel_NodePermissionsRes.cpp
+  Zel_NodeResolutionsRes.cpp
+  Zel_RemoveReservationRes.cpp
+  Zel_RenameUniqueRes.cpp
+  Zel_Req.cpp
+  Zel_Requests.cpp
+  Zel_Res.cpp
+  Zel_SetApplicationSettingsRes.cpp
+  Zel_SetUserSettingsRes.cpp
+  Zel_SettingsRes.cpp
+  Zel_StartupRes.cpp
+  zel_qtcompat_p.h
+  zel_resultitems_p.h
+)

@@ -1,0 +1,36 @@
+# Sources of the value types.
+set(ZEL_MODEL_SOURCES
+  Zel_Dependency.cpp
+  Zel_DependencySPList.cpp
+  Zel_Directory.cpp
+  Zel_DirectoryList.cpp
+  Zel_Filename.cpp
+  Zel_FrameLocator.cpp
+  Zel_FrameProperty.cpp
+  Zel_FramePropertyList.cpp
+  Zel_LoginCredentials.cpp
+  Zel_MimeTypeSpec.cpp
+  Zel_MobAttr.cpp
+  Zel_MobAttrList.cpp
+  Zel_MobDesc.cpp
+  Zel_MobDescList.cpp
+  Zel_MobID.cpp
+  Zel_MobIDList.cpp
+  Zel_MobPropertyChange.cpp
+  Zel_Node.cpp
+  Zel_NodeList.cpp
+  Zel_NodePermissions.cpp
+  Zel_Property.cpp
+  Zel_PropertyKeyInfo.cpp
+  Zel_PropertyKeyInfoList.cpp
+  Zel_PropertyKeys.cpp
+  Zel_PropertyList.cpp
+  Zel_PropertyManager.cpp
+  Zel_QuerySpec.cpp
+  Zel_ResolutionID.cpp
+  Zel_ResolutionIDList.cpp
+  Zel_Setting.cpp
+  Zel_SettingList.cpp
+  zel_xml.cpp
+  zel_xml_p.h
+)

@@ -1,0 +1,22 @@
+# Sources of the request engine and threading stand-ins (libzel_platform).
+set(ZEL_PLATFORM_SOURCES
+  Orv.cpp
+  Orv_Engine.cpp
+  Orv_Request.cpp
+  Orv_RequestID.cpp
+  Orv_Result.cpp
+  Orv_ResultQ.cpp
+  Orv_ResultsCB.cpp
+  Threads_Mutex.cpp
+)
+set(ZEL_PLATFORM_HEADERS
+  Orv.h
+  Orv_Engine.h
+  Orv_Request.h
+  Orv_RequestID.h
+  Orv_Result.h
+  Orv_ResultQ.h
+  Orv_ResultsCB.h
+  Threads_Mutex.h
+  Threads_MutexTenure.h
+)
