@@ -103,65 +103,10 @@ class Zel_SetUserSettingsCB;
 class Zel_SettingsCB;
 class Zel_StartupCB;
 
-// Requests.
-class Zel_AddDependencyReq;
-class Zel_AddFrameLocatorListReq;
-class Zel_AddFrameRestrictionListReq;
-class Zel_AnalyzeReq;
-class Zel_AssociationsReq;
-class Zel_CheckinLocalBinReq;
-class Zel_CheckinReq;
-class Zel_CheckinUpdateReq;
-class Zel_ChildrenAtMonikerReq;
-class Zel_ChildrenAtReq;
-class Zel_ChildrenReq;
-class Zel_CopyNodeReq;
-class Zel_CreateFolderReq;
-class Zel_CreateFolderUniqueReq;
-class Zel_CreateNodeUniqueReq;
-class Zel_CreatePropertyReq;
-class Zel_CreateReservationReq;
-class Zel_DeleteFrameLocatorListReq;
-class Zel_DeleteFrameRestrictionListReq;
-class Zel_DeleteNodeReq;
-class Zel_DeleteReq;
-class Zel_DirReq;
-class Zel_GetApplicationSettingsReq;
-class Zel_GetChildrenReq;
-class Zel_GetFrameLocatorListReq;
-class Zel_GetFrameRestrictionListReq;
-class Zel_GetLinkedProjectsReq;
-class Zel_GetNodeReq;
-class Zel_GetPropertiesReq;
-class Zel_GetReservationsReq;
-class Zel_GetSettingsReq;
-class Zel_GetSyncedProjRootReq;
-class Zel_GetUserPriviledgesReq;
-class Zel_GetUserSettingsReq;
-class Zel_GetWorkgroupSettingsReq;
-class Zel_LoginReq;
-class Zel_MediaResolutionsReq;
-class Zel_MobBinaryDnDReq;
-class Zel_MobBinaryReq;
-class Zel_MobHeadframeReq;
-class Zel_MobNodeReq;
-class Zel_MonikerReq;
-class Zel_MoveNodeReq;
-class Zel_NodePermissionsReq;
-class Zel_NodeReq;
-class Zel_NodeResolutionsReq;
-class Zel_PropertyListReq;
-class Zel_QueryReq;
-class Zel_RefreshNodeReq;
-class Zel_RemoveReservationReq;
-class Zel_RenameNodeReq;
-class Zel_RenameUniqueReq;
-class Zel_RootNodeReq;
-class Zel_SaveSettingsReq;
-class Zel_SetApplicationSettingsReq;
-class Zel_SetPropertiesReq;
-class Zel_SetUserSettingsReq;
-class Zel_StartupReq;
+// Requests: one class per line of the catalogue.
+#define ZEL_REQUEST(Stem, Base, Name, Params, Args) class Zel_##Stem##Req;
+#include "zel_requests.def"
+#undef ZEL_REQUEST
 
 class ZEL_EXPORT Zel_Session
 {
@@ -227,123 +172,14 @@ public:
     // --- Request factories (backend), one per request class ----------------
     // Each returns a request constructed with the given callback, ready to be
     // submitted, or an empty pointer. Moniker lists are lists of moniker texts.
-
-    // Adds the dependencies to the node; answers its node and dependency list.
-    virtual boost::shared_ptr<Zel_AddDependencyReq> makeAddDependencyReqSP(MonikerSP moniker, const Zel_DependencySPList& dependencies, boost::shared_ptr<Zel_DependencyCB> callback) = 0;
-    // Adds frame locators to the media asset.
-    virtual boost::shared_ptr<Zel_AddFrameLocatorListReq> makeAddFrameLocatorListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& locators, boost::shared_ptr<Zel_FrameLocatorListCB> callback) = 0;
-    // Adds frame restrictions (given as locators of the restricted frames) to the media asset.
-    virtual boost::shared_ptr<Zel_AddFrameRestrictionListReq> makeAddFrameRestrictionListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& restrictions, boost::shared_ptr<Zel_FrameRestrictionListCB> callback) = 0;
-    // Analyses local media files before their check-in.
-    virtual boost::shared_ptr<Zel_AnalyzeReq> makeAnalyzeReqSP(const QStringList& filePaths, boost::shared_ptr<Zel_AnalyzeCB> callback) = 0;
-    // Reads the locations (directories) associated with the node.
-    virtual boost::shared_ptr<Zel_AssociationsReq> makeAssociationsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_AssociationsCB> callback) = 0;
-    // Checks in the media of a local bin file under the folder; answered like a check-in (Zel_CheckinCB).
-    virtual boost::shared_ptr<Zel_CheckinLocalBinReq> makeCheckinLocalBinReqSP(const QString& binFilePath, MonikerSP folderMoniker, boost::shared_ptr<Zel_CheckinCB> callback) = 0;
-    // Checks in the described media objects under the folder, one answer per object.
-    virtual boost::shared_ptr<Zel_CheckinReq> makeCheckinReqSP(const Zel_MobDescList& mobs, MonikerSP folderMoniker, boost::shared_ptr<Zel_CheckinCB> callback) = 0;
-    // Updates the server's copy of media objects checked in before.
-    virtual boost::shared_ptr<Zel_CheckinUpdateReq> makeCheckinUpdateReqSP(const Zel_MobDescList& mobs, boost::shared_ptr<Zel_CheckinUpdateCB> callback) = 0;
-    // Lists the children of the node named by the moniker (the callback's parent moniker is set).
-    virtual boost::shared_ptr<Zel_ChildrenAtMonikerReq> makeChildrenAtMonikerReqSP(MonikerSP parentMoniker, boost::shared_ptr<Zel_ChildrenAtMonikerCB> callback) = 0;
-    // Lists the children of the node at the path.
-    virtual boost::shared_ptr<Zel_ChildrenAtReq> makeChildrenAtReqSP(const Zel_Directory& path, boost::shared_ptr<Zel_ChildrenAtCB> callback) = 0;
-    // Lists the children of the node with their has-children flags.
-    virtual boost::shared_ptr<Zel_ChildrenReq> makeChildrenReqSP(MonikerSP parentMoniker, boost::shared_ptr<Zel_ChildrenCB> callback) = 0;
-    // Copies the node into the destination folder.
-    virtual boost::shared_ptr<Zel_CopyNodeReq> makeCopyNodeReqSP(MonikerSP moniker, MonikerSP destinationMoniker, boost::shared_ptr<Zel_CopyNodeCB> callback) = 0;
-    // Creates a folder of that name in the parent; fails if the name is taken.
-    virtual boost::shared_ptr<Zel_CreateFolderReq> makeCreateFolderReqSP(MonikerSP parentMoniker, const QString& name, boost::shared_ptr<Zel_CreateFolderCB> callback) = 0;
-    // Creates a folder in the parent, made unique from the name; answers the new node.
-    virtual boost::shared_ptr<Zel_CreateFolderUniqueReq> makeCreateFolderUniqueReqSP(MonikerSP parentMoniker, const QString& name, boost::shared_ptr<Zel_CreateFolderUniqueCB> callback) = 0;
-    // Creates a node with the properties (its type among them) in the parent, made unique from the name.
-    virtual boost::shared_ptr<Zel_CreateNodeUniqueReq> makeCreateNodeUniqueReqSP(MonikerSP parentMoniker, const QString& name, const Zel_PropertyList& properties, boost::shared_ptr<Zel_ResultCB> callback) = 0;
-    // Adds a new property to the node; its key must pass isValidPropertyName.
-    virtual boost::shared_ptr<Zel_CreatePropertyReq> makeCreatePropertyReqSP(MonikerSP moniker, const Zel_Property& property, boost::shared_ptr<Zel_CreatePropertyCB> callback) = 0;
-    // Reserves the node for the user until the expiry time (server time).
-    virtual boost::shared_ptr<Zel_CreateReservationReq> makeCreateReservationReqSP(MonikerSP moniker, const QDateTime& expiry, boost::shared_ptr<Zel_CreateReservationCB> callback) = 0;
-    // Removes the frame locators (matched by identifier) from the media asset.
-    virtual boost::shared_ptr<Zel_DeleteFrameLocatorListReq> makeDeleteFrameLocatorListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& locators, boost::shared_ptr<Zel_FrameLocatorListCB> callback) = 0;
-    // Removes the frame restrictions (matched by identifier) from the media asset.
-    virtual boost::shared_ptr<Zel_DeleteFrameRestrictionListReq> makeDeleteFrameRestrictionListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& restrictions, boost::shared_ptr<Zel_FrameRestrictionListCB> callback) = 0;
-    // Deletes one node from the tree; answers true when it is gone.
-    virtual boost::shared_ptr<Zel_DeleteNodeReq> makeDeleteNodeReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultBoolCB> callback) = 0;
-    // Deletes the assets and, when asked, their media on the server and on this machine.
-    virtual boost::shared_ptr<Zel_DeleteReq> makeDeleteReqSP(const QStringList& monikers, bool deleteRemoteMedia, bool deleteLocalMedia, boost::shared_ptr<Zel_DeleteCB> callback) = 0;
-    // Reads the path of the node.
-    virtual boost::shared_ptr<Zel_DirReq> makeDirReqSP(MonikerSP moniker, boost::shared_ptr<Zel_DirCB> callback) = 0;
-    // Reads the settings text stored for the application.
-    virtual boost::shared_ptr<Zel_GetApplicationSettingsReq> makeGetApplicationSettingsReqSP(const QString& applicationName, boost::shared_ptr<Zel_GetApplicationSettingsCB> callback) = 0;
-    // Reads the children of the node, one node per answer.
-    virtual boost::shared_ptr<Zel_GetChildrenReq> makeGetChildrenReqSP(MonikerSP parentMoniker, boost::shared_ptr<Zel_ResultCB> callback) = 0;
-    // Reads the frame locators of the media asset.
-    virtual boost::shared_ptr<Zel_GetFrameLocatorListReq> makeGetFrameLocatorListReqSP(MonikerSP moniker, boost::shared_ptr<Zel_FrameLocatorListCB> callback) = 0;
-    // Reads the frame restrictions of the media asset.
-    virtual boost::shared_ptr<Zel_GetFrameRestrictionListReq> makeGetFrameRestrictionListReqSP(MonikerSP moniker, boost::shared_ptr<Zel_FrameRestrictionListCB> callback) = 0;
-    // Reads the projects linked to the node, one node per answer.
-    virtual boost::shared_ptr<Zel_GetLinkedProjectsReq> makeGetLinkedProjectsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultCB> callback) = 0;
-    // Reads the node named by the moniker.
-    virtual boost::shared_ptr<Zel_GetNodeReq> makeGetNodeReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultCB> callback) = 0;
-    // Reads the named properties of the node (all when the list is empty); answered through Zel_PropertyListCB.
-    virtual boost::shared_ptr<Zel_GetPropertiesReq> makeGetPropertiesReqSP(MonikerSP moniker, const QStringList& keys, boost::shared_ptr<Zel_PropertyListCB> callback) = 0;
-    // Reads the reservations of the node (holder and expiry).
-    virtual boost::shared_ptr<Zel_GetReservationsReq> makeGetReservationsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_GetReservationsCB> callback) = 0;
-    // Reads the settings document stored under the name.
-    virtual boost::shared_ptr<Zel_GetSettingsReq> makeGetSettingsReqSP(const QString& settingsName, boost::shared_ptr<Zel_GetSettingsCB> callback) = 0;
-    // Reads the root node of the synced project that holds the node.
-    virtual boost::shared_ptr<Zel_GetSyncedProjRootReq> makeGetSyncedProjRootReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultCB> callback) = 0;
-    // Reads the privileges of the user on the node; answered through Zel_NodePermissionsCB.
-    virtual boost::shared_ptr<Zel_GetUserPriviledgesReq> makeGetUserPriviledgesReqSP(const QString& userName, MonikerSP moniker, boost::shared_ptr<Zel_NodePermissionsCB> callback) = 0;
-    // Reads the logged-in user's settings of the type.
-    virtual boost::shared_ptr<Zel_GetUserSettingsReq> makeGetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsType settingsType, boost::shared_ptr<Zel_GetUserSettingsCB> callback) = 0;
-    // Reads the workgroup's settings text; answered through Zel_SettingsCB.
-    virtual boost::shared_ptr<Zel_GetWorkgroupSettingsReq> makeGetWorkgroupSettingsReqSP(boost::shared_ptr<Zel_SettingsCB> callback) = 0;
-    // Logs the user in; credentials may carry backend-specific extras or be null.
-    virtual boost::shared_ptr<Zel_LoginReq> makeLoginReqSP(const QString& userName, const QString& password, boost::shared_ptr<Zel_LoginCredentials> credentials, boost::shared_ptr<Zel_LoginCB> callback) = 0;
-    // Reads the descriptions of the media resolutions the server knows.
-    virtual boost::shared_ptr<Zel_MediaResolutionsReq> makeMediaResolutionsReqSP(boost::shared_ptr<Zel_MediaResolutionsCB> callback) = 0;
-    // Reads the binary form of the media objects for a drag-and-drop.
-    virtual boost::shared_ptr<Zel_MobBinaryDnDReq> makeMobBinaryDnDReqSP(const Zel_MobIDList& mobs, boost::shared_ptr<Zel_MobBinaryDnDCB> callback) = 0;
-    // Reads the binary form of the media object.
-    virtual boost::shared_ptr<Zel_MobBinaryReq> makeMobBinaryReqSP(boost::shared_ptr<Zel_MobID> mob, boost::shared_ptr<Zel_MobBinaryCB> callback) = 0;
-    // Reads the head frame of the media object.
-    virtual boost::shared_ptr<Zel_MobHeadframeReq> makeMobHeadframeReqSP(boost::shared_ptr<Zel_MobID> mob, boost::shared_ptr<Zel_MobHeadframeCB> callback) = 0;
-    // Reads the node of the media object.
-    virtual boost::shared_ptr<Zel_MobNodeReq> makeMobNodeReqSP(boost::shared_ptr<Zel_MobID> mob, boost::shared_ptr<Zel_MobNodeCB> callback) = 0;
-    // Reads the moniker of the node at the path.
-    virtual boost::shared_ptr<Zel_MonikerReq> makeMonikerReqSP(const Zel_Directory& path, boost::shared_ptr<Zel_MonikerCB> callback) = 0;
-    // Moves the node into the destination folder.
-    virtual boost::shared_ptr<Zel_MoveNodeReq> makeMoveNodeReqSP(MonikerSP moniker, MonikerSP destinationMoniker, boost::shared_ptr<Zel_MoveNodeCB> callback) = 0;
-    // Reads the logged-in user's permissions on the node.
-    virtual boost::shared_ptr<Zel_NodePermissionsReq> makeNodePermissionsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_NodePermissionsCB> callback) = 0;
-    // Reads the node at the path.
-    virtual boost::shared_ptr<Zel_NodeReq> makeNodeReqSP(const Zel_Directory& path, boost::shared_ptr<Zel_NodeCB> callback) = 0;
-    // Reads the media resolutions held for the node, one media object per answer.
-    virtual boost::shared_ptr<Zel_NodeResolutionsReq> makeNodeResolutionsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_NodeResolutionsCB> callback) = 0;
-    // Reads every property of the node.
-    virtual boost::shared_ptr<Zel_PropertyListReq> makePropertyListReqSP(MonikerSP moniker, boost::shared_ptr<Zel_PropertyListCB> callback) = 0;
-    // Searches the tree; the callback is given the query specification.
-    virtual boost::shared_ptr<Zel_QueryReq> makeQueryReqSP(boost::shared_ptr<Zel_QuerySpec> query, boost::shared_ptr<Zel_QueryCB> callback) = 0;
-    // Reads the node again from the server, bypassing caches.
-    virtual boost::shared_ptr<Zel_RefreshNodeReq> makeRefreshNodeReqSP(MonikerSP moniker, boost::shared_ptr<Zel_RefreshNodeCB> callback) = 0;
-    // Removes the user's reservation of the node.
-    virtual boost::shared_ptr<Zel_RemoveReservationReq> makeRemoveReservationReqSP(MonikerSP moniker, boost::shared_ptr<Zel_RemoveReservationCB> callback) = 0;
-    // Renames the node; fails if the name is taken.
-    virtual boost::shared_ptr<Zel_RenameNodeReq> makeRenameNodeReqSP(MonikerSP moniker, const QString& newName, boost::shared_ptr<Zel_RenameNodeCB> callback) = 0;
-    // Renames the node to a name made unique from the given one; answers the node.
-    virtual boost::shared_ptr<Zel_RenameUniqueReq> makeRenameUniqueReqSP(MonikerSP moniker, const QString& newName, boost::shared_ptr<Zel_RenameUniqueCB> callback) = 0;
-    // Reads the root node of the server's tree.
-    virtual boost::shared_ptr<Zel_RootNodeReq> makeRootNodeReqSP(boost::shared_ptr<Zel_RootNodeCB> callback) = 0;
-    // Stores the settings document (XML text, see Zel_SettingList::toXML) under the name.
-    virtual boost::shared_ptr<Zel_SaveSettingsReq> makeSaveSettingsReqSP(const QString& settingsName, const QString& settingsXml, boost::shared_ptr<Zel_SaveSettingsCB> callback) = 0;
-    // Stores the settings text for the application.
-    virtual boost::shared_ptr<Zel_SetApplicationSettingsReq> makeSetApplicationSettingsReqSP(const QString& applicationName, const QString& settingsXml, boost::shared_ptr<Zel_SetApplicationSettingsCB> callback) = 0;
-    // Sets property values of the node; pass a Zel_ConditionalSetPropertiesCB for a conditional set.
-    virtual boost::shared_ptr<Zel_SetPropertiesReq> makeSetPropertiesReqSP(MonikerSP moniker, const Zel_PropertyList& properties, boost::shared_ptr<Zel_SetPropertiesCB> callback) = 0;
-    // Stores the logged-in user's settings of the type.
-    virtual boost::shared_ptr<Zel_SetUserSettingsReq> makeSetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsType settingsType, const QString& settingsXml, boost::shared_ptr<Zel_SetUserSettingsCB> callback) = 0;
-    // Prepares the session for work after login (caches, server checks).
-    virtual boost::shared_ptr<Zel_StartupReq> makeStartupReqSP(boost::shared_ptr<Zel_StartupCB> callback) = 0;
+    // The factories are declared from the catalogue, zel_requests.def, which
+    // says what each request does; make<Stem>ReqSP makes a Zel_<Stem>Req.
+    // Include zel_request_headers.h (or the request's own header, such as
+    // Zel_GetNodeReq.h) to hand the request to submitRequest.
+#define ZEL_REQUEST(Stem, Base, Name, Params, Args) \
+    virtual boost::shared_ptr<Zel_##Stem##Req> make##Stem##ReqSP Params = 0;
+#include "zel_requests.def"
+#undef ZEL_REQUEST
 
     // --- Name rules -------------------------------------------------------
 

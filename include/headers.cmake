@@ -1,57 +1,37 @@
-# The public headers, one per class; installed under include/zel.
+# The public headers, one per class, installed under include/zel. The request
+# classes' headers are generated from zel_requests.def (cmake/ZelRequests.cmake).
 set(ZEL_PUBLIC_HEADERS
-  Zel_AddDependencyReq.h
+  zel_requests.def
   Zel_AddDependencyRes.h
-  Zel_AddFrameLocatorListReq.h
-  Zel_AddFrameRestrictionListReq.h
   Zel_AnalyzeCB.h
-  Zel_AnalyzeReq.h
   Zel_AssociationsCB.h
-  Zel_AssociationsReq.h
   Zel_AssociationsRes.h
   Zel_CheckinCB.h
-  Zel_CheckinLocalBinReq.h
-  Zel_CheckinReq.h
   Zel_CheckinRes.h
   Zel_CheckinUpdateCB.h
-  Zel_CheckinUpdateReq.h
   Zel_CheckinUpdateRes.h
   Zel_ChildrenAtCB.h
   Zel_ChildrenAtMonikerCB.h
-  Zel_ChildrenAtMonikerReq.h
-  Zel_ChildrenAtReq.h
   Zel_ChildrenCB.h
-  Zel_ChildrenReq.h
   Zel_ChildrenRes.h
   Zel_ConditionalSetPropertiesCB.h
   Zel_ConnectionListener.h
   Zel_CopyNodeCB.h
-  Zel_CopyNodeReq.h
   Zel_CreateFolderCB.h
-  Zel_CreateFolderReq.h
   Zel_CreateFolderUniqueCB.h
-  Zel_CreateFolderUniqueReq.h
   Zel_CreateFolderUniqueRes.h
-  Zel_CreateNodeUniqueReq.h
   Zel_CreateNodeUniqueRes.h
   Zel_CreatePropertyCB.h
-  Zel_CreatePropertyReq.h
   Zel_CreateReservationCB.h
-  Zel_CreateReservationReq.h
   Zel_CreateReservationRes.h
   Zel_Debug.h
   Zel_DeleteCB.h
-  Zel_DeleteFrameLocatorListReq.h
-  Zel_DeleteFrameRestrictionListReq.h
-  Zel_DeleteNodeReq.h
   Zel_DeleteNodeRes.h
-  Zel_DeleteReq.h
   Zel_DeleteRes.h
   Zel_Dependency.h
   Zel_DependencyCB.h
   Zel_DependencySPList.h
   Zel_DirCB.h
-  Zel_DirReq.h
   Zel_Directory.h
   Zel_DirectoryList.h
   Zel_Error.h
@@ -72,38 +52,23 @@ set(ZEL_PUBLIC_HEADERS
   Zel_FrameRestrictionListCB.h
   Zel_GenericRes.h
   Zel_GetApplicationSettingsCB.h
-  Zel_GetApplicationSettingsReq.h
   Zel_GetApplicationSettingsRes.h
   Zel_GetChildrenCB.h
-  Zel_GetChildrenReq.h
   Zel_GetChildrenRes.h
-  Zel_GetFrameLocatorListReq.h
-  Zel_GetFrameRestrictionListReq.h
-  Zel_GetLinkedProjectsReq.h
   Zel_GetLinkedProjectsRes.h
-  Zel_GetNodeReq.h
   Zel_GetNodeRes.h
-  Zel_GetPropertiesReq.h
   Zel_GetReservationsCB.h
-  Zel_GetReservationsReq.h
   Zel_GetReservationsRes.h
   Zel_GetSettingsCB.h
-  Zel_GetSettingsReq.h
-  Zel_GetSyncedProjRootReq.h
   Zel_GetSyncedProjRootRes.h
-  Zel_GetUserPriviledgesReq.h
   Zel_GetUserSettingsCB.h
-  Zel_GetUserSettingsReq.h
   Zel_GetUserSettingsRes.h
-  Zel_GetWorkgroupSettingsReq.h
   Zel_IEventListenerFolder.h
   Zel_IIEventListenerFolder.h
   Zel_LoginBriefCB.h
   Zel_LoginCB.h
   Zel_LoginCredentials.h
-  Zel_LoginReq.h
   Zel_MediaResolutionsCB.h
-  Zel_MediaResolutionsReq.h
   Zel_MediaResolutionsRes.h
   Zel_Message.h
   Zel_MimeTypeSpec.h
@@ -112,32 +77,23 @@ set(ZEL_PUBLIC_HEADERS
   Zel_MobAttrList.h
   Zel_MobBinaryCB.h
   Zel_MobBinaryDnDCB.h
-  Zel_MobBinaryDnDReq.h
-  Zel_MobBinaryReq.h
   Zel_MobDesc.h
   Zel_MobDescList.h
   Zel_MobHeadframeCB.h
-  Zel_MobHeadframeReq.h
   Zel_MobID.h
   Zel_MobIDList.h
   Zel_MobNodeCB.h
-  Zel_MobNodeReq.h
   Zel_MobPropertyChange.h
   Zel_MonikerCB.h
-  Zel_MonikerReq.h
   Zel_MoveNodeCB.h
-  Zel_MoveNodeReq.h
   Zel_Node.h
   Zel_NodeCB.h
   Zel_NodeList.h
   Zel_NodeListener.h
   Zel_NodePermissions.h
   Zel_NodePermissionsCB.h
-  Zel_NodePermissionsReq.h
   Zel_NodePermissionsRes.h
-  Zel_NodeReq.h
   Zel_NodeResolutionsCB.h
-  Zel_NodeResolutionsReq.h
   Zel_NodeResolutionsRes.h
   Zel_Property.h
   Zel_PropertyKeyInfo.h
@@ -146,20 +102,14 @@ set(ZEL_PUBLIC_HEADERS
   Zel_PropertyKeys.h
   Zel_PropertyList.h
   Zel_PropertyListCB.h
-  Zel_PropertyListReq.h
   Zel_PropertyManager.h
   Zel_QueryCB.h
-  Zel_QueryReq.h
   Zel_QuerySpec.h
   Zel_RefreshNodeCB.h
-  Zel_RefreshNodeReq.h
   Zel_RemoveReservationCB.h
-  Zel_RemoveReservationReq.h
   Zel_RemoveReservationRes.h
   Zel_RenameNodeCB.h
-  Zel_RenameNodeReq.h
   Zel_RenameUniqueCB.h
-  Zel_RenameUniqueReq.h
   Zel_RenameUniqueRes.h
   Zel_Req.h
   Zel_Res.h
@@ -168,26 +118,20 @@ set(ZEL_PUBLIC_HEADERS
   Zel_ResultBoolCB.h
   Zel_ResultCB.h
   Zel_RootNodeCB.h
-  Zel_RootNodeReq.h
   Zel_SaveSettingsCB.h
-  Zel_SaveSettingsReq.h
   Zel_SequenceKeys.h
   Zel_ServerCheckCB.h
   Zel_Session.h
   Zel_SetApplicationSettingsCB.h
-  Zel_SetApplicationSettingsReq.h
   Zel_SetApplicationSettingsRes.h
   Zel_SetPropertiesCB.h
-  Zel_SetPropertiesReq.h
   Zel_SetUserSettingsCB.h
-  Zel_SetUserSettingsReq.h
   Zel_SetUserSettingsRes.h
   Zel_Setting.h
   Zel_SettingList.h
   Zel_SettingsCB.h
   Zel_SettingsRes.h
   Zel_StartupCB.h
-  Zel_StartupReq.h
   Zel_StartupRes.h
   Zel_StatusNotificationCB.h
   Zel_StatusNotificationRes.h
