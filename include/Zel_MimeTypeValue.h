@@ -34,4 +34,10 @@ enum Zel_MimeTypeValue : quint32
     Zel_MimeType_StereoSubClip = 0x100000     // "stereosubclip"
 };
 
+// The two groups the library and backends sort nodes into.
+// Containers: project, bin, folder, catalog, workspace, playbackdevices.
+constexpr quint32 Zel_MimeTypes_Containers = 0x7E00;
+// Media: every clip, sequence, effect, group and filemob type.
+constexpr quint32 Zel_MimeTypes_Media = 0x1981FF;
+
 #endif

@@ -7,8 +7,6 @@
 namespace {
 
 // Masks of the kind predicates.
-const unsigned long kFolderMask = 0x7E00;   // project, bin, folder, catalog, workspace, playbackdevices
-const unsigned long kMediaMask = 0x1981FF;  // every clip, sequence, effect, group and filemob type
 const unsigned long kAbstractAssetMask = 0x20000; // Asset
 
 // Lower case of a Latin-1 code unit as QChar::toLower gives it: A-Z and
@@ -128,12 +126,12 @@ Zel_Node::~Zel_Node() = default;
 
 bool Zel_Node::isFolder() const
 {
-    return Zel_MimeTypeSpec(kFolderMask).isType(const_cast<Zel_Node*>(this)->getMimeType());
+    return Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(const_cast<Zel_Node*>(this)->getMimeType());
 }
 
 bool Zel_Node::isMedia() const
 {
-    return Zel_MimeTypeSpec(kMediaMask).isType(const_cast<Zel_Node*>(this)->getMimeType());
+    return Zel_MimeTypeSpec(Zel_MimeTypes_Media).isType(const_cast<Zel_Node*>(this)->getMimeType());
 }
 
 bool Zel_Node::isAbstractAsset() const

@@ -112,3 +112,20 @@ TEST(Zel_MimeTypeSpecTest, AddRemoveAndSetChangeTheMask)
     EXPECT_EQ(assigned.get(), 0x1234ul);
     EXPECT_FALSE(assigned == Zel_MimeTypeSpec());
 }
+
+TEST(Zel_MimeTypeSpecTest, GroupConstantsHoldExactlyTheirTypes)
+{
+    EXPECT_EQ(Zel_MimeTypes_Containers, quint32(Zel_MimeType_Project | Zel_MimeType_Bin | Zel_MimeType_Folder |
+                                                Zel_MimeType_Catalog | Zel_MimeType_Workspace |
+                                                Zel_MimeType_PlaybackDevices));
+    EXPECT_EQ(Zel_MimeTypes_Media,
+              quint32(Zel_MimeType_MasterClip | Zel_MimeType_Sequence | Zel_MimeType_SubClip | Zel_MimeType_Group |
+                      Zel_MimeType_MotionEffect | Zel_MimeType_Effect | Zel_MimeType_RenderedEffect |
+                      Zel_MimeType_AudioClip | Zel_MimeType_FileMob | Zel_MimeType_MasterClipEWC |
+                      Zel_MimeType_AudioClipEWC | Zel_MimeType_StereoMasterClip | Zel_MimeType_StereoSubClip));
+    // The groups do not overlap, and together they are the default set.
+    EXPECT_EQ(0u, Zel_MimeTypes_Containers & Zel_MimeTypes_Media);
+    EXPECT_TRUE(Zel_MimeTypeSpec(Zel_MimeTypes_Containers | Zel_MimeTypes_Media) == Zel_MimeTypeSpec());
+    EXPECT_FALSE(Zel_MimeTypeSpec(Zel_MimeTypes_Media).isType(QStringLiteral("bin")));
+    EXPECT_FALSE(Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(QStringLiteral("Asset")));
+}
