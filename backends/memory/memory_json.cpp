@@ -309,12 +309,15 @@ private:
 
     // Node IDs and monikers given in the file, so that generated ones avoid
     // them wherever they appear (also later in the file).
+    // Also makes room for all the nodes in the tree's tables.
     void collectExplicitIds(const QJsonObject& root)
     {
         std::vector<QJsonObject> pending{root};
+        int count = 0;
         while (!pending.empty()) {
             const QJsonObject o = pending.back();
             pending.pop_back();
+            ++count;
             const QJsonValue id = o.value(QStringLiteral("id"));
             if (id.isString())
                 mExplicitIds.insert(id.toString());
@@ -329,6 +332,9 @@ private:
                 }
             }
         }
+        mTree.nodes.reserve(static_cast<std::size_t>(count));
+        mTree.idByMoniker.reserve(count);
+        mPaths.reserve(count);
     }
 
     QString generatedId()
@@ -360,6 +366,9 @@ private:
         std::vector<Pending> pending;
         auto pushChildren = [&](const QJsonObject& o, const QString& path, const QString& id, int depth) {
             const QJsonArray children = optArray(o, QStringLiteral("children"), path);
+            if (children.isEmpty())
+                return;
+            mTree.byId(id)->childByName.reserve(children.size());
             const QString childrenPath = dot(path, QStringLiteral("children"));
             for (int i = children.size() - 1; i >= 0; --i)
                 pending.push_back(Pending{children.at(i), at(childrenPath, i), id, depth + 1});
