@@ -714,11 +714,14 @@ QJsonObject nodeToJson(const Tree& tree, const Node& node)
     }
 }
 
-// Finds a member name given twice in one object of a JSON text that has
-// parsed without error (Qt's reader keeps the last silently). Reads the text
-// once, without recursion; names are compared after unescaping. Answers the
-// byte offsets of the second and of the first occurrence (of their opening
-// quotes), or false when every object's names are distinct.
+// Finds a member name given twice in one object of a JSON text (Qt's reader
+// keeps the last silently, and Qt 5's leaks the replaced value). Runs before
+// the reader, once over the text, without recursion; names are compared after
+// unescaping. Answers the byte offsets of the second and of the first
+// occurrence (of their opening quotes), or false when every object's names
+// are distinct, and also false as soon as the text is malformed in a way it
+// notices (mismatched brackets, a name without ":"), so that the reader
+// reports that error instead.
 bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, QString& name)
 {
     struct Level {
@@ -740,8 +743,9 @@ bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, 
             break;
         case '}':
         case ']':
-            if (!levels.empty())
-                levels.pop_back();
+            if (levels.empty() || levels.back().object != (c == '}'))
+                return false;
+            levels.pop_back();
             break;
         case ',':
             if (!levels.empty() && levels.back().object)
@@ -762,13 +766,22 @@ bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, 
             if (levels.empty() || !levels.back().object || !levels.back().expectName)
                 break;
             levels.back().expectName = false;
+            int colon = j + 1;
+            while (colon < size && (data[colon] == ' ' || data[colon] == '\t' || data[colon] == '\n' || data[colon] == '\r'))
+                ++colon;
+            if (colon >= size || data[colon] != ':')
+                return false;
             QString text;
             if (!escaped) {
                 text = QString::fromUtf8(data + start + 1, j - start - 1);
             } else {
                 // Let the JSON reader unescape the name: ["<name>"].
-                QByteArray wrapped = QByteArray("[") + QByteArray(data + start, j - start + 1) + ']';
-                text = QJsonDocument::fromJson(wrapped).array().at(0).toString();
+                const QByteArray wrapped = QByteArray("[") + QByteArray(data + start, j - start + 1) + ']';
+                QJsonParseError unescapeError;
+                const QJsonDocument unescaped = QJsonDocument::fromJson(wrapped, &unescapeError);
+                if (unescapeError.error != QJsonParseError::NoError)
+                    return false;
+                text = unescaped.array().at(0).toString();
             }
             auto known = levels.back().names.constFind(text);
             if (known != levels.back().names.constEnd()) {
@@ -791,19 +804,6 @@ bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, 
 
 bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QString& error)
 {
-    QJsonParseError parseError;
-    const QJsonDocument document = QJsonDocument::fromJson(json, &parseError);
-    if (parseError.error != QJsonParseError::NoError) {
-        int line = 0;
-        int column = 0;
-        position(json, parseError.offset, line, column);
-        error = QStringLiteral("%1:%2:%3: %4").arg(sourceName).arg(line).arg(column).arg(parseError.errorString());
-        return false;
-    }
-    if (!document.isObject()) {
-        error = sourceName + QStringLiteral(": the tree file must hold one JSON object");
-        return false;
-    }
     int duplicate = 0;
     int first = 0;
     QString member;
@@ -821,6 +821,19 @@ bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QSt
                     .arg(member)
                     .arg(firstLine)
                     .arg(firstColumn);
+        return false;
+    }
+    QJsonParseError parseError;
+    const QJsonDocument document = QJsonDocument::fromJson(json, &parseError);
+    if (parseError.error != QJsonParseError::NoError) {
+        int line = 0;
+        int column = 0;
+        position(json, parseError.offset, line, column);
+        error = QStringLiteral("%1:%2:%3: %4").arg(sourceName).arg(line).arg(column).arg(parseError.errorString());
+        return false;
+    }
+    if (!document.isObject()) {
+        error = sourceName + QStringLiteral(": the tree file must hold one JSON object");
         return false;
     }
     try {

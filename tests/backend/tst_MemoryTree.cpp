@@ -255,6 +255,11 @@ TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
     EXPECT_EQ(QStringLiteral("tree.json:1:32: a second member named \"name\" in one object (the first is at 1:19)"),
               loadError(escaped));
 
+    // A text broken near the second name is a syntax error, not a duplicate.
+    const QString broken = loadError("{\"root\":{}, \"root\" {}}");
+    EXPECT_TRUE(broken.startsWith(QStringLiteral("tree.json:1:")) && !broken.contains(QStringLiteral("second member")))
+        << broken.toStdString();
+
     // The same name in different objects, and names as values, are fine.
     EXPECT_TRUE(Zel_MemoryTree::fromJson(
         "{\"root\":{\"id\":\"id\",\"name\":\"name\",\"mimeType\":\"workspace\",\"children\":["
