@@ -41,7 +41,9 @@ public:
     // The bundled sample tree as JSON text.
     static QByteArray sampleJson();
     // A tree read from a JSON file; empty on failure, with *error (when given)
-    // naming the file and the position of the fault.
+    // naming the file and the position of the fault. A file that breaks the
+    // server's rules (a name with "/", a second node with a media object ID,
+    // nodes deeper than Zel_MemoryLimits::MaxDepth, ...) is refused as well.
     static boost::shared_ptr<Zel_MemoryTree> fromFile(const QString& path, QString* error = nullptr);
     // A tree read from JSON text; sourceName stands for the file in messages.
     static boost::shared_ptr<Zel_MemoryTree> fromJson(const QByteArray& json, const QString& sourceName,

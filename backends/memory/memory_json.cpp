@@ -1,9 +1,18 @@
 // Loading the tree from JSON and saving it back, with Qt's JSON classes.
 //
-// Syntax errors are reported as "FILE:LINE:COLUMN: message" (the parser's
-// byte offset turned into a line and a character column); every other
-// problem as "FILE: PATH: message", where PATH names the offending value the
-// way one would write it in code (root.children[2].name).
+// Syntax errors, and a member name given twice in one object (which Qt's
+// reader would resolve silently by keeping the last), are reported as
+// "FILE:LINE:COLUMN: message" (a byte offset turned into a line and a
+// character column); every other problem as "FILE: PATH: message", where PATH
+// names the offending value the way one would write it in code
+// (root.children[2].name).
+//
+// Besides the form of the file, the loader enforces the server's own rules,
+// so that a file holds only what the server itself could have built: names
+// without "/" and within the name limit, distinct node IDs, monikers and
+// media object IDs, dependencies and masters that name nodes, known key
+// types and file version, the depth limit and the settings limits
+// (Zel_MemoryLimits.h). Nodes are read and written without recursion.
 #include "memory_tree_p.h"
 
 #include "Zel_MimeTypeSpec.h"
@@ -15,6 +24,8 @@
 #include <QJsonParseError>
 #include <QJsonValue>
 #include <QSet>
+
+#include <vector>
 
 namespace ZelMemory {
 
@@ -41,6 +52,10 @@ public:
         const QString format = optString(top, QStringLiteral("format"), QString(), QString());
         if (!format.isEmpty() && format != QLatin1String(kFormat))
             fail(QStringLiteral("format"), QStringLiteral("expected \"%1\", found \"%2\"").arg(QLatin1String(kFormat), format));
+        const int version = optInt(top, QStringLiteral("version"), QString(), TreeFileVersion);
+        if (version != TreeFileVersion)
+            fail(QStringLiteral("version"),
+                 QStringLiteral("unknown version %1 (this server reads version %2)").arg(version).arg(TreeFileVersion));
         mTree.serverName = optString(top, QStringLiteral("server"), QString(), QStringLiteral("Zel Memory Server"));
         readUsers(top);
         readKeys(top);
@@ -48,10 +63,9 @@ public:
         readSettings(top);
         if (!top.value(QStringLiteral("root")).isObject())
             fail(QStringLiteral("root"), QStringLiteral("missing or not an object (the tree's root node)"));
-        Node& root = readNode(top.value(QStringLiteral("root")).toObject(), QStringLiteral("root"), nullptr);
-        if (!Zel_MimeTypeSpec(0x7E00).isType(root.mimeType))
-            fail(QStringLiteral("root.mimeType"), QStringLiteral("the root must be a container (project, bin, folder, catalog, workspace), not \"%1\"").arg(root.mimeType));
-        mTree.rootId = root.id;
+        const QJsonObject rootObject = top.value(QStringLiteral("root")).toObject();
+        collectExplicitIds(rootObject);
+        readNodes(rootObject);
         resolveReferences();
         readLinkedProjects(top);
     }
@@ -147,13 +161,27 @@ private:
     // The path of a member: its key alone at the top, otherwise parent.key.
     static QString fieldPath(const QString& parent, const QString& key) { return parent.isEmpty() ? key : dot(parent, key); }
 
+    // Settings obey the limits of settings documents (see MaxSettingsLevels).
     SettingPairs readPairs(const QJsonObject& object, const QString& path)
     {
         SettingPairs pairs;
+        qint64 size = 0;
+        if (object.size() > MaxSettingsCount)
+            fail(path, QStringLiteral("more than %1 settings").arg(MaxSettingsCount));
         for (auto it = object.begin(); it != object.end(); ++it) {
+            const QString key = it.key();
             if (!it.value().isString())
-                fail(dot(path, it.key()), QStringLiteral("expected a string"));
-            pairs.append(qMakePair(it.key(), it.value().toString()));
+                fail(dot(path, key), QStringLiteral("expected a string"));
+            if (key.size() > MaxSettingsKeyLength)
+                fail(dot(path, key.left(20) + QStringLiteral("...")),
+                     QStringLiteral("a settings key longer than %1 characters").arg(MaxSettingsKeyLength));
+            if (key.count(QLatin1Char('.')) >= MaxSettingsLevels)
+                fail(dot(path, key), QStringLiteral("a settings key of more than %1 levels").arg(MaxSettingsLevels));
+            const QString value = it.value().toString();
+            size += key.size() + value.size();
+            if (size > MaxSettingsSize)
+                fail(path, QStringLiteral("settings of more than %1 characters").arg(MaxSettingsSize));
+            pairs.append(qMakePair(key, value));
         }
         return pairs;
     }
@@ -191,7 +219,12 @@ private:
             key.internalName = optString(o, QStringLiteral("internalName"), path, key.key);
             key.modifiable = optBool(o, QStringLiteral("modifiable"), path, true);
             key.available = optBool(o, QStringLiteral("available"), path, true);
-            key.type = optInt(o, QStringLiteral("type"), path, 1);
+            key.type = optInt(o, QStringLiteral("type"), path, KeyTypeText);
+            if (!isKnownKeyType(key.type))
+                fail(dot(path, QStringLiteral("type")),
+                     QStringLiteral("unknown key type %1 (expected 1 text, 2 video resolution, 3 audio resolution, "
+                                    "4 timecode, 5 date or 6 number)")
+                         .arg(key.type));
             key.textSearchable = optBool(o, QStringLiteral("textSearchable"), path, true);
             key.hasCustomValues = optBool(o, QStringLiteral("customValues"), path, false);
             mTree.keys.append(key);
@@ -274,12 +307,98 @@ private:
         return markers;
     }
 
+    // Node IDs and monikers given in the file, so that generated ones avoid
+    // them wherever they appear (also later in the file).
+    // Also makes room for all the nodes in the tree's tables.
+    void collectExplicitIds(const QJsonObject& root)
+    {
+        std::vector<QJsonObject> pending{root};
+        int count = 0;
+        while (!pending.empty()) {
+            const QJsonObject o = pending.back();
+            pending.pop_back();
+            ++count;
+            const QJsonValue id = o.value(QStringLiteral("id"));
+            if (id.isString())
+                mExplicitIds.insert(id.toString());
+            const QJsonValue moniker = o.value(QStringLiteral("moniker"));
+            if (moniker.isString())
+                mExplicitMonikers.insert(moniker.toString());
+            const QJsonValue children = o.value(QStringLiteral("children"));
+            if (children.isArray()) {
+                for (const QJsonValue& child : children.toArray()) {
+                    if (child.isObject())
+                        pending.push_back(child.toObject());
+                }
+            }
+        }
+        mTree.nodes.reserve(static_cast<std::size_t>(count));
+        mTree.idByMoniker.reserve(count);
+        mPaths.reserve(count);
+    }
+
+    QString generatedId()
+    {
+        for (;;) {
+            const QString id = mTree.newNodeId();
+            if (!mExplicitIds.contains(id) && !mExplicitMonikers.contains(kMonikerPrefix + id))
+                return id;
+        }
+    }
+
+    // The tree below "root", depth first with children in order, without
+    // recursion: each node is read and inserted before its children, and a
+    // folder's children are taken in file order.
+    void readNodes(const QJsonObject& rootObject)
+    {
+        const QString rootPath = QStringLiteral("root");
+        Node& root = readNode(rootObject, rootPath, nullptr);
+        if (!Zel_MimeTypeSpec(0x7E00).isType(root.mimeType))
+            fail(QStringLiteral("root.mimeType"), QStringLiteral("the root must be a container (project, bin, folder, catalog, workspace), not \"%1\"").arg(root.mimeType));
+        mTree.rootId = root.id;
+
+        struct Pending {
+            QJsonValue value;
+            QString path;
+            QString parentId;
+            int depth;
+        };
+        std::vector<Pending> pending;
+        auto pushChildren = [&](const QJsonObject& o, const QString& path, const QString& id, int depth) {
+            const QJsonArray children = optArray(o, QStringLiteral("children"), path);
+            if (children.isEmpty())
+                return;
+            mTree.byId(id)->childByName.reserve(children.size());
+            const QString childrenPath = dot(path, QStringLiteral("children"));
+            for (int i = children.size() - 1; i >= 0; --i)
+                pending.push_back(Pending{children.at(i), at(childrenPath, i), id, depth + 1});
+        };
+        pushChildren(rootObject, rootPath, root.id, 0);
+        while (!pending.empty()) {
+            const Pending next = pending.back();
+            pending.pop_back();
+            if (!next.value.isObject())
+                fail(next.path, QStringLiteral("expected an object"));
+            const QJsonObject child = next.value.toObject();
+            Node* parent = mTree.byId(next.parentId);
+            const QString childName = child.value(QStringLiteral("name")).toString();
+            if (!childName.isEmpty() && mTree.childNamed(*parent, childName))
+                fail(dot(next.path, QStringLiteral("name")), QStringLiteral("a second child named \"%1\" in \"%2\"").arg(childName, parent->name));
+            if (next.depth > MaxDepth)
+                fail(next.path, QStringLiteral("lies %1 levels below the root; the server allows at most %2").arg(next.depth).arg(MaxDepth));
+            const Node& stored = readNode(child, next.path, parent);
+            pushChildren(child, next.path, stored.id, next.depth);
+        }
+    }
+
+    // One node without its children, inserted under parent (the root when
+    // parent is null).
     Node& readNode(const QJsonObject& o, const QString& path, Node* parent)
     {
         Node node;
         node.id = optString(o, QStringLiteral("id"), path, QString());
         if (node.id.isEmpty())
-            node.id = mTree.newNodeId();
+            node.id = generatedId();
         if (mTree.byId(node.id))
             fail(dot(path, QStringLiteral("id")), QStringLiteral("a second node with the ID \"%1\"").arg(node.id));
         node.moniker = optString(o, QStringLiteral("moniker"), path, kMonikerPrefix + node.id);
@@ -288,6 +407,12 @@ private:
         if (mTree.idByMoniker.contains(node.moniker))
             fail(dot(path, QStringLiteral("moniker")), QStringLiteral("a second node with the moniker \"%1\"").arg(node.moniker));
         node.name = reqString(o, QStringLiteral("name"), path);
+        if (node.name.contains(QLatin1Char('/')))
+            fail(dot(path, QStringLiteral("name")),
+                 QStringLiteral("\"%1\" contains \"/\", which separates the names of a path").arg(node.name));
+        if (node.name.size() > MaxNameLength)
+            fail(dot(path, QStringLiteral("name")),
+                 QStringLiteral("longer than the %1 characters a name may have").arg(MaxNameLength));
         node.mimeType = reqString(o, QStringLiteral("mimeType"), path);
         Zel_MimeTypeValue mimeValue;
         if (!Zel_MimeTypeSpec::getType(node.mimeType, mimeValue))
@@ -295,6 +420,12 @@ private:
         if (parent && !Zel_MimeTypeSpec(0x7E00).isType(parent->mimeType))
             fail(path, QStringLiteral("the parent \"%1\" is a %2, which cannot hold children").arg(parent->name, parent->mimeType));
         node.mobId = optString(o, QStringLiteral("mobID"), path, QString());
+        if (!node.mobId.isEmpty()) {
+            if (mMobIds.contains(node.mobId))
+                fail(dot(path, QStringLiteral("mobID")),
+                     QStringLiteral("a second node with the media object ID \"%1\"").arg(node.mobId));
+            mMobIds.insert(node.mobId);
+        }
         node.masterMoniker = optString(o, QStringLiteral("master"), path, QString());
         node.userPlaced = optBool(o, QStringLiteral("userPlaced"), path, true);
         node.created = optDate(o, QStringLiteral("created"), path);
@@ -359,6 +490,7 @@ private:
             const QJsonObject d = element(deps, i, p);
             Dependency dep;
             dep.moniker = reqString(d, QStringLiteral("moniker"), p);
+            mDependencyPaths.append(qMakePair(dep.moniker, dot(p, QStringLiteral("moniker"))));
             dep.usage = optString(d, QStringLiteral("usage"), p, QString());
             dep.type = optInt(d, QStringLiteral("type"), p, 0);
             node.dependencies.append(dep);
@@ -383,21 +515,16 @@ private:
             stored = &mTree.nodes.emplace(id, std::move(node)).first->second;
         }
         mPaths.insert(stored->id, path);
-
-        const QJsonArray children = optArray(o, QStringLiteral("children"), path);
-        for (int i = 0; i < children.size(); ++i) {
-            const QString p = at(dot(path, QStringLiteral("children")), i);
-            const QJsonObject child = element(children, i, p);
-            const QString childName = child.value(QStringLiteral("name")).toString();
-            if (!childName.isEmpty() && mTree.childNamed(*stored, childName))
-                fail(dot(p, QStringLiteral("name")), QStringLiteral("a second child named \"%1\" in \"%2\"").arg(childName, stored->name));
-            readNode(child, p, stored);
-        }
         return *stored;
     }
 
     void resolveReferences()
     {
+        // Dependencies name nodes by moniker, in file order.
+        for (const auto& dependency : mDependencyPaths) {
+            if (!mTree.byMoniker(dependency.first))
+                fail(dependency.second, QStringLiteral("no node has the moniker \"%1\"").arg(dependency.first));
+        }
         for (const auto& entry : mTree.nodes) {
             const Node& node = entry.second;
             if (!node.masterMoniker.isEmpty() && !mTree.byMoniker(node.masterMoniker) && !mTree.byId(node.masterMoniker))
@@ -432,6 +559,10 @@ private:
     Tree& mTree;
     QString mSource;
     QHash<QString, QString> mPaths; // node ID -> path in the file
+    QSet<QString> mExplicitIds;
+    QSet<QString> mExplicitMonikers;
+    QSet<QString> mMobIds;
+    QList<QPair<QString, QString>> mDependencyPaths; // moniker -> path of the dependency's moniker
 };
 
 // Line and column (both from 1; the column counts characters) of a byte offset.
@@ -475,7 +606,8 @@ QJsonArray markersToJson(const QList<Marker>& markers)
     return list;
 }
 
-QJsonObject nodeToJson(const Tree& tree, const Node& node)
+// One node's members without its children.
+QJsonObject nodeFieldsToJson(const Node& node)
 {
     QJsonObject o;
     o.insert(QStringLiteral("id"), node.id);
@@ -548,21 +680,149 @@ QJsonObject nodeToJson(const Tree& tree, const Node& node)
         }
         o.insert(QStringLiteral("media"), media);
     }
-    if (!node.children.isEmpty()) {
-        QJsonArray children;
-        for (const QString& id : node.children) {
-            if (const Node* child = tree.byId(id))
-                children.append(nodeToJson(tree, *child));
-        }
-        o.insert(QStringLiteral("children"), children);
-    }
     return o;
+}
+
+// A node and its subtree, built without recursion: a stack of open nodes,
+// each with the children array it is filling; a node's object is complete
+// when its last child is, and then goes into its parent's array.
+QJsonObject nodeToJson(const Tree& tree, const Node& node)
+{
+    struct Open {
+        const Node* node;
+        QJsonObject object;
+        QJsonArray children;
+        int next;
+    };
+    std::vector<Open> open;
+    open.push_back(Open{&node, nodeFieldsToJson(node), QJsonArray(), 0});
+    for (;;) {
+        Open& top = open.back();
+        if (top.next < top.node->children.size()) {
+            const Node* child = tree.byId(top.node->children.at(top.next++));
+            if (child)
+                open.push_back(Open{child, nodeFieldsToJson(*child), QJsonArray(), 0});
+            continue;
+        }
+        if (!top.node->children.isEmpty())
+            top.object.insert(QStringLiteral("children"), top.children);
+        QJsonObject done = top.object;
+        open.pop_back();
+        if (open.empty())
+            return done;
+        open.back().children.append(done);
+    }
+}
+
+// Finds a member name given twice in one object of a JSON text (Qt's reader
+// keeps the last silently, and Qt 5's leaks the replaced value). Runs before
+// the reader, once over the text, without recursion; names are compared after
+// unescaping. Answers the byte offsets of the second and of the first
+// occurrence (of their opening quotes), or false when every object's names
+// are distinct, and also false as soon as the text is malformed in a way it
+// notices (mismatched brackets, a name without ":"), so that the reader
+// reports that error instead.
+bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, QString& name)
+{
+    struct Level {
+        bool object;
+        bool expectName;
+        QHash<QString, int> names; // name -> offset
+    };
+    std::vector<Level> levels;
+    const char* data = json.constData();
+    const int size = json.size();
+    for (int i = 0; i < size; ++i) {
+        const char c = data[i];
+        switch (c) {
+        case '{':
+            levels.push_back(Level{true, true, QHash<QString, int>()});
+            break;
+        case '[':
+            levels.push_back(Level{false, false, QHash<QString, int>()});
+            break;
+        case '}':
+        case ']':
+            if (levels.empty() || levels.back().object != (c == '}'))
+                return false;
+            levels.pop_back();
+            break;
+        case ',':
+            if (!levels.empty() && levels.back().object)
+                levels.back().expectName = true;
+            break;
+        case '"': {
+            const int start = i;
+            bool escaped = false;
+            int j = i + 1;
+            while (j < size && data[j] != '"') {
+                if (data[j] == '\\') {
+                    escaped = true;
+                    ++j;
+                }
+                ++j;
+            }
+            i = j; // the closing quote
+            if (levels.empty() || !levels.back().object || !levels.back().expectName)
+                break;
+            levels.back().expectName = false;
+            int colon = j + 1;
+            while (colon < size && (data[colon] == ' ' || data[colon] == '\t' || data[colon] == '\n' || data[colon] == '\r'))
+                ++colon;
+            if (colon >= size || data[colon] != ':')
+                return false;
+            QString text;
+            if (!escaped) {
+                text = QString::fromUtf8(data + start + 1, j - start - 1);
+            } else {
+                // Let the JSON reader unescape the name: ["<name>"].
+                const QByteArray wrapped = QByteArray("[") + QByteArray(data + start, j - start + 1) + ']';
+                QJsonParseError unescapeError;
+                const QJsonDocument unescaped = QJsonDocument::fromJson(wrapped, &unescapeError);
+                if (unescapeError.error != QJsonParseError::NoError)
+                    return false;
+                text = unescaped.array().at(0).toString();
+            }
+            auto known = levels.back().names.constFind(text);
+            if (known != levels.back().names.constEnd()) {
+                offset = start;
+                firstOffset = known.value();
+                name = text;
+                return true;
+            }
+            levels.back().names.insert(text, start);
+            break;
+        }
+        default:
+            break;
+        }
+    }
+    return false;
 }
 
 } // namespace
 
 bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QString& error)
 {
+    int duplicate = 0;
+    int first = 0;
+    QString member;
+    if (findDuplicateMember(json, duplicate, first, member)) {
+        int line = 0;
+        int column = 0;
+        int firstLine = 0;
+        int firstColumn = 0;
+        position(json, duplicate, line, column);
+        position(json, first, firstLine, firstColumn);
+        error = QStringLiteral("%1:%2:%3: a second member named \"%4\" in one object (the first is at %5:%6)")
+                    .arg(sourceName)
+                    .arg(line)
+                    .arg(column)
+                    .arg(member)
+                    .arg(firstLine)
+                    .arg(firstColumn);
+        return false;
+    }
     QJsonParseError parseError;
     const QJsonDocument document = QJsonDocument::fromJson(json, &parseError);
     if (parseError.error != QJsonParseError::NoError) {

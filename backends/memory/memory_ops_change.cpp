@@ -79,6 +79,7 @@ Node& createFolder(Work& work, WriteHold& hold, const boost::shared_ptr<QString>
     work.require(parent, PermAddFolders, QStringLiteral("add folders to"));
     work.requireNotReservedByOther(parent, QStringLiteral("add to"), false);
     work.requireAssetName(name);
+    requireDepth(work, parent, 0);
     if (unique)
         name = work.tree.uniqueChildName(parent, name);
     else
@@ -101,19 +102,25 @@ Node& renameNode(Work& work, WriteHold& hold, const boost::shared_ptr<QString>& 
         name = work.tree.uniqueChildName(parent, name);
     else
         work.requireFreeName(parent, name, &node);
-    node.name = name;
+    work.tree.rename(node, name);
     node.modified = QDateTime::currentDateTimeUtc();
     hold.updated(parent.moniker, node.moniker);
     return node;
 }
 
-// The records of the subtree at node, node first.
+// The records of the subtree at node, node first, then depth first with
+// children in order (no recursion).
 void collectSubtree(const Tree& tree, const Node& node, QList<const Node*>& out)
 {
-    out.append(&node);
-    for (const QString& id : node.children) {
-        if (const Node* child = tree.byId(id))
-            collectSubtree(tree, *child, out);
+    std::vector<const Node*> pending{&node};
+    while (!pending.empty()) {
+        const Node* n = pending.back();
+        pending.pop_back();
+        out.append(n);
+        for (int i = n->children.size() - 1; i >= 0; --i) {
+            if (const Node* child = tree.byId(n->children.at(i)))
+                pending.push_back(child);
+        }
     }
 }
 
@@ -178,6 +185,17 @@ QList<Zel_FrameLocator> changeMarkers(Work& work, const boost::shared_ptr<QStrin
 
 } // namespace
 
+void requireDepth(Work& work, const Node& parent, int height)
+{
+    const int deepest = work.tree.depthOf(parent) + 1 + height;
+    if (deepest > MaxDepth)
+        fail(Zel_MemoryErrorCodes::TooDeep,
+             QStringLiteral("Nodes added to %1 would lie %2 levels below the root; the server allows at most %3.")
+                 .arg(work.describe(parent))
+                 .arg(deepest)
+                 .arg(MaxDepth));
+}
+
 // --- Creating -------------------------------------------------------------------
 
 void CreateFolderOp::run(Work& work, const Args& args, Result& result)
@@ -209,14 +227,21 @@ void CreateNodeUniqueOp::run(Work& work, const Args& args, Result& result)
     work.require(parent, addPermissionFor(mimeType), QStringLiteral("add to"));
     work.requireNotReservedByOther(parent, QStringLiteral("add to"), false);
     work.requireAssetName(args.name);
+    requireDepth(work, parent, 0);
     Node node = newNode(work, work.tree.uniqueChildName(parent, args.name), mimeType);
     for (const Zel_Property& property : args.properties) {
         const QString key = property.key();
         if (key == QLatin1String("Mime Type") || key == QLatin1String("Name"))
             continue;
         if (key == QLatin1String("MobID")) {
-            if (!property.value().isEmpty())
+            if (!property.value().isEmpty()) {
+                // A media object ID names one node on the server.
+                if (const Node* owner = work.tree.byMobId(property.value()))
+                    fail(Zel_MemoryErrorCodes::MobIDExists,
+                         QStringLiteral("The media object ID \"%1\" belongs to %2 already.")
+                             .arg(property.value(), work.describe(*owner)));
                 node.mobId = property.value();
+            }
             continue;
         }
         if (!work.session.isValidPropertyName(key))
@@ -269,10 +294,10 @@ void MoveNodeOp::run(Work& work, const Args& args, Result& result)
     work.requireNotReservedByOther(destination, QStringLiteral("move into"), false);
     if (oldParent.id != destination.id) {
         work.requireFreeName(destination, node.name);
+        requireDepth(work, destination, work.tree.heightOf(node));
         const QString oldParentMoniker = oldParent.moniker;
         work.tree.detach(node);
-        node.parentId = destination.id;
-        destination.children.append(node.id);
+        work.tree.attach(node, destination);
         node.modified = QDateTime::currentDateTimeUtc();
         hold.removed(oldParentMoniker, node.moniker);
         hold.added(destination.moniker, node.moniker);
@@ -294,6 +319,7 @@ void CopyNodeOp::run(Work& work, const Args& args, Result& result)
     work.require(source, PermCopy, QStringLiteral("copy"));
     work.require(destination, addPermissionFor(source.mimeType), QStringLiteral("copy nodes into"));
     work.requireNotReservedByOther(destination, QStringLiteral("copy into"), false);
+    requireDepth(work, destination, work.tree.heightOf(source));
     QList<const Node*> subtree;
     collectSubtree(work.tree, source, subtree);
     const unsigned long total = static_cast<unsigned long>(subtree.size());

@@ -97,6 +97,7 @@ void CheckinOp::run(Work& work, const Args& args, Result& result)
     work.requireNotReservedByOther(folder, QStringLiteral("check media in to"), false);
     if (args.mobs.size() == 0)
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media objects to check in were given."));
+    requireDepth(work, folder, 0);
     const QString resolution = defaultResolution(work.tree);
     // One answer per media object; one that cannot be checked in is reported
     // and the others go on.
@@ -110,10 +111,7 @@ void CheckinOp::run(Work& work, const Args& args, Result& result)
         }
         const QString file = mediaFileOf(*desc);
         QString mobID = desc->getMobID().isEmpty() ? work.tree.newMobId() : desc->getMobID();
-        bool known = false;
-        for (const auto& entry : work.tree.nodes)
-            known = known || entry.second.mobId == mobID;
-        if (known) {
+        if (work.tree.byMobId(mobID)) {
             result.addItem(desc, boost::shared_ptr<Zel_Node>(), boost::shared_ptr<QString>(),
                            Zel_MemoryError::make(Zel_MemoryErrorCodes::InvalidMedia,
                                                  QStringLiteral("Media object \"%1\" is checked in already; update it instead.").arg(mobID)));
@@ -151,6 +149,7 @@ void CheckinLocalBinOp::run(Work& work, const Args& args, Result& result)
     work.requireNotReservedByOther(folder, QStringLiteral("check a bin in to"), false);
     const QString name = QFileInfo(args.binFile).completeBaseName();
     work.requireAssetName(name);
+    requireDepth(work, folder, 0);
     // The bin arrives as a new bin of the folder, named after the file.
     Node bin;
     bin.id = work.tree.newNodeId();

@@ -146,6 +146,9 @@ boost::shared_ptr<QString> sharedText(const QString& text);
 QList<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent);
 // The node's locators (restrictions = false) or restrictions (true).
 QList<Zel_FrameLocator> markersOf(const Node& node, bool restrictions);
+// Fails with TooDeep unless a subtree of the given height (0: one node) fits
+// below parent within MaxDepth (memory_ops_change.cpp).
+void requireDepth(Work& work, const Node& parent, int height);
 
 #define ZEL_MEMORY_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                                   \
     struct Name {                                                                                                  \

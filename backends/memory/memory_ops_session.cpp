@@ -14,9 +14,11 @@
 #include "Zel_SettingsRes.h"
 #include "Zel_StartupRes.h"
 
-#include <QDomDocument>
-#include <QDomElement>
+#include <QHash>
 #include <QUuid>
+#include <QXmlStreamReader>
+
+#include <vector>
 
 namespace ZelMemory {
 
@@ -24,43 +26,107 @@ namespace {
 
 QString settingsXml(const SettingPairs& pairs, const QString& root)
 {
+    // Stored keys are distinct (one per leaf, see settingsFromXml; a tree
+    // file's settings are JSON members), so no lookup per setting is needed.
     Zel_SettingList list;
+    list.reserve(pairs.size());
     for (const auto& pair : pairs)
-        list.addIfKeyNotInList(Zel_Setting(pair.first, pair.second));
+        list.append(Zel_Setting(pair.first, pair.second));
     return list.toXML(root);
 }
 
-void collectLeaves(const QDomElement& element, const QString& prefix, SettingPairs& out)
-{
-    bool hasChildElements = false;
-    for (QDomElement child = element.firstChildElement(); !child.isNull(); child = child.nextSiblingElement()) {
-        hasChildElements = true;
-        collectLeaves(child, prefix.isEmpty() ? child.tagName() : prefix + QLatin1Char('.') + child.tagName(), out);
-    }
-    if (!hasChildElements && !prefix.isEmpty()) {
-        for (auto& pair : out) {
-            if (pair.first == prefix) {
-                pair.second = element.text();
-                return;
-            }
-        }
-        out.append(qMakePair(prefix, element.text()));
-    }
-}
-
 // The settings of an XML document: every leaf element below the root, its
-// key the dotted path of element names. Malformed XML fails with its position.
+// key the dotted path of element names below the root, its value the
+// element's text; a later leaf with the same key replaces the value of the
+// earlier one, which keeps its place. Fails with InvalidArgument, naming the
+// position, when the XML is not well-formed or exceeds the settings limits
+// (MaxSettingsLevels and the others). The document is read as a stream, one
+// token at a time, without recursion and without building a tree; each key
+// is built from its parent's by appending one level.
 SettingPairs settingsFromXml(const QString& xml)
 {
-    QDomDocument document;
-    QString message;
-    int line = 0;
-    int column = 0;
-    if (!document.setContent(xml, &message, &line, &column))
+    if (xml.size() > MaxSettingsSize)
         fail(Zel_MemoryErrorCodes::InvalidArgument,
-             QStringLiteral("The settings are not well-formed XML (line %1, column %2: %3).").arg(line).arg(column).arg(message));
+             QStringLiteral("The settings document has %1 characters; the server accepts at most %2.")
+                 .arg(xml.size())
+                 .arg(MaxSettingsSize));
+    QXmlStreamReader reader(xml);
+    reader.setNamespaceProcessing(false); // names are taken whole, prefix and all
     SettingPairs pairs;
-    collectLeaves(document.documentElement(), QString(), pairs);
+    QHash<QString, int> indexOfKey;
+    qint64 stored = 0;
+    QString key;                   // the key of the innermost open element below the root
+    std::vector<int> parentLength; // per open element below the root: its parent's key length
+    int open = 0;                  // open elements, the root included
+    bool leaf = false;             // the innermost open element has no child element yet
+    QString text;                  // its text so far
+    bool blank = true;             // that text is only white space outside CDATA
+    auto refuse = [&reader](const QString& what) {
+        fail(Zel_MemoryErrorCodes::InvalidArgument,
+             QStringLiteral("The settings %1 (line %2, column %3).").arg(what).arg(reader.lineNumber()).arg(reader.columnNumber()));
+    };
+    while (!reader.atEnd()) {
+        switch (reader.readNext()) {
+        case QXmlStreamReader::StartElement:
+            if (open > 0) {
+                if (open > MaxSettingsLevels)
+                    refuse(QStringLiteral("nest deeper than %1 levels below the root").arg(MaxSettingsLevels));
+                parentLength.push_back(key.size());
+                if (open > 1)
+                    key += QLatin1Char('.');
+                key += reader.qualifiedName();
+                if (key.size() > MaxSettingsKeyLength)
+                    refuse(QStringLiteral("have a key longer than %1 characters").arg(MaxSettingsKeyLength));
+            }
+            ++open;
+            leaf = true;
+            text.clear();
+            blank = true;
+            break;
+        case QXmlStreamReader::Characters:
+            if (leaf) {
+                text += reader.text();
+                blank = blank && reader.isWhitespace() && !reader.isCDATA();
+            }
+            break;
+        case QXmlStreamReader::EndElement:
+            // White space alone is layout, not a value (as the DOM reads it).
+            if (blank)
+                text.clear();
+            if (leaf && open > 1) {
+                auto known = indexOfKey.constFind(key);
+                if (known == indexOfKey.constEnd()) {
+                    if (pairs.size() >= MaxSettingsCount)
+                        refuse(QStringLiteral("hold more than %1 keys").arg(MaxSettingsCount));
+                    stored += key.size() + text.size();
+                    indexOfKey.insert(key, pairs.size());
+                    pairs.append(qMakePair(key, text));
+                } else {
+                    QString& value = pairs[known.value()].second;
+                    stored += text.size() - value.size();
+                    value = text;
+                }
+                if (stored > MaxSettingsSize)
+                    refuse(QStringLiteral("keys and values come to more than %1 characters").arg(MaxSettingsSize));
+            }
+            --open;
+            if (!parentLength.empty()) {
+                key.truncate(parentLength.back());
+                parentLength.pop_back();
+            }
+            leaf = false;
+            text.clear();
+            break;
+        default:
+            break;
+        }
+    }
+    if (reader.hasError())
+        fail(Zel_MemoryErrorCodes::InvalidArgument,
+             QStringLiteral("The settings are not well-formed XML (line %1, column %2: %3).")
+                 .arg(reader.lineNumber())
+                 .arg(reader.columnNumber())
+                 .arg(reader.errorString()));
     return pairs;
 }
 

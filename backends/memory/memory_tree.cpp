@@ -2,6 +2,9 @@
 
 #include <QUuid>
 
+#include <algorithm>
+#include <utility>
+
 namespace ZelMemory {
 
 namespace {
@@ -197,10 +200,20 @@ const Node* Tree::reservedByOther(const Node& node, const QString& userName, boo
         return &node;
     if (!below)
         return nullptr;
-    for (const QString& id : node.children) {
-        if (const Node* child = byId(id)) {
-            if (const Node* found = reservedByOther(*child, userName))
-                return found;
+    // Depth first, children in order, without recursion.
+    std::vector<const Node*> pending;
+    for (int i = node.children.size() - 1; i >= 0; --i) {
+        if (const Node* child = byId(node.children.at(i)))
+            pending.push_back(child);
+    }
+    while (!pending.empty()) {
+        const Node* n = pending.back();
+        pending.pop_back();
+        if (n->reservation.isActive() && n->reservation.user != userName)
+            return n;
+        for (int i = n->children.size() - 1; i >= 0; --i) {
+            if (const Node* child = byId(n->children.at(i)))
+                pending.push_back(child);
         }
     }
     return nullptr;
@@ -208,10 +221,41 @@ const Node* Tree::reservedByOther(const Node& node, const QString& userName, boo
 
 const Node* Tree::childNamed(const Node& parent, const QString& name) const
 {
-    for (const QString& id : parent.children) {
-        const Node* child = byId(id);
-        if (child && child->name == name)
-            return child;
+    auto it = parent.childByName.constFind(name);
+    return it == parent.childByName.constEnd() ? nullptr : byId(it.value());
+}
+
+int Tree::depthOf(const Node& node) const
+{
+    int depth = 0;
+    for (const Node* n = parentOf(node); n; n = parentOf(*n))
+        ++depth;
+    return depth;
+}
+
+int Tree::heightOf(const Node& node) const
+{
+    int height = 0;
+    std::vector<std::pair<const Node*, int>> pending{{&node, 0}};
+    while (!pending.empty()) {
+        const std::pair<const Node*, int> entry = pending.back();
+        pending.pop_back();
+        height = std::max(height, entry.second);
+        for (const QString& id : entry.first->children) {
+            if (const Node* child = byId(id))
+                pending.emplace_back(child, entry.second + 1);
+        }
+    }
+    return height;
+}
+
+const Node* Tree::byMobId(const QString& mobId) const
+{
+    if (mobId.isEmpty())
+        return nullptr;
+    for (const auto& entry : nodes) {
+        if (entry.second.mobId == mobId)
+            return &entry.second;
     }
     return nullptr;
 }
@@ -263,59 +307,108 @@ QString Tree::newMobId()
 
 Node& Tree::insertNode(Node node, Node& parent)
 {
-    node.parentId = parent.id;
     const QString id = node.id;
     idByMoniker.insert(node.moniker, id);
-    parent.children.append(id);
     Node& stored = nodes.emplace(id, std::move(node)).first->second;
+    attach(stored, parent);
     return stored;
 }
 
 Node& Tree::copySubtree(const Node& source, Node& target, const QString& name)
 {
-    Node copy = source;
-    copy.id = newNodeId();
-    copy.moniker = QStringLiteral("zel-mem://") + copy.id;
-    copy.name = name;
-    copy.children.clear();
-    copy.reservation = Reservation();
-    copy.created = copy.modified = QDateTime::currentDateTimeUtc();
-    if (!copy.mobId.isEmpty())
-        copy.mobId = newMobId();
-    const QStringList sourceChildren = source.children; // source may move on insertion? no: stable refs
-    Node& stored = insertNode(std::move(copy), target);
-    for (const QString& childId : sourceChildren) {
-        if (const Node* child = byId(childId)) {
-            const Node childCopy = *child; // copy first: stored may be its ancestor
-            copySubtree(childCopy, stored, childCopy.name);
-        }
+    // Depth first without recursion; each source's children are pushed in
+    // reverse so that the copies are made (and numbered) in preorder and
+    // every copied folder keeps its children's order. The source subtree is
+    // not changed meanwhile: the target is not inside it.
+    const QDateTime now = QDateTime::currentDateTimeUtc();
+    auto copyOne = [&](const Node& from, Node& under, const QString& as) -> Node& {
+        Node copy = from;
+        copy.id = newNodeId();
+        copy.moniker = QStringLiteral("zel-mem://") + copy.id;
+        copy.name = as;
+        copy.children.clear();
+        copy.childByName.clear();
+        copy.reservation = Reservation();
+        copy.created = copy.modified = now;
+        if (!copy.mobId.isEmpty())
+            copy.mobId = newMobId();
+        return insertNode(std::move(copy), under);
+    };
+    struct Pending {
+        QString sourceId;
+        QString targetId;
+    };
+    Node& top = copyOne(source, target, name);
+    const QString topId = top.id;
+    std::vector<Pending> pending;
+    for (int i = source.children.size() - 1; i >= 0; --i)
+        pending.push_back(Pending{source.children.at(i), topId});
+    while (!pending.empty()) {
+        const Pending next = pending.back();
+        pending.pop_back();
+        const Node* from = byId(next.sourceId);
+        Node* under = byId(next.targetId);
+        if (!from || !under)
+            continue;
+        const QStringList fromChildren = from->children;
+        const QString copiedId = copyOne(*from, *under, from->name).id;
+        for (int i = fromChildren.size() - 1; i >= 0; --i)
+            pending.push_back(Pending{fromChildren.at(i), copiedId});
     }
-    return stored;
+    return *byId(topId);
 }
 
 void Tree::removeSubtree(const QString& id, QStringList* removed)
 {
-    Node* node = byId(id);
-    if (!node)
+    Node* top = byId(id);
+    if (!top)
         return;
-    const QStringList children = node->children;
-    for (const QString& childId : children)
-        removeSubtree(childId, removed);
-    node = byId(id);
-    if (!node)
-        return;
-    detach(*node);
-    idByMoniker.remove(node->moniker);
-    if (removed)
-        removed->append(id);
-    nodes.erase(id);
+    // Only the top leaves its parent's lists; the records below go with it.
+    detach(*top);
+    QStringList subtree{id};
+    for (int i = 0; i < subtree.size(); ++i) {
+        if (const Node* node = byId(subtree.at(i)))
+            subtree.append(node->children);
+    }
+    // Deepest first, as children before their parents.
+    for (int i = subtree.size() - 1; i >= 0; --i) {
+        auto it = nodes.find(subtree.at(i));
+        if (it == nodes.end())
+            continue;
+        idByMoniker.remove(it->second.moniker);
+        if (removed)
+            removed->append(it->first);
+        nodes.erase(it);
+    }
 }
 
 void Tree::detach(Node& node)
 {
-    if (Node* parent = byId(node.parentId))
-        parent->children.removeAll(node.id);
+    if (Node* parent = byId(node.parentId)) {
+        parent->children.removeOne(node.id);
+        auto it = parent->childByName.find(node.name);
+        if (it != parent->childByName.end() && it.value() == node.id)
+            parent->childByName.erase(it);
+    }
     node.parentId.clear();
+}
+
+void Tree::attach(Node& node, Node& parent)
+{
+    node.parentId = parent.id;
+    parent.children.append(node.id);
+    parent.childByName.insert(node.name, node.id);
+}
+
+void Tree::rename(Node& node, const QString& name)
+{
+    if (Node* parent = byId(node.parentId)) {
+        auto it = parent->childByName.find(node.name);
+        if (it != parent->childByName.end() && it.value() == node.id)
+            parent->childByName.erase(it);
+        parent->childByName.insert(name, node.id);
+    }
+    node.name = name;
 }
 
 void Tree::addObserver(const boost::shared_ptr<Observer>& observer)

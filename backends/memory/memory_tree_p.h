@@ -22,6 +22,7 @@
 #include <QString>
 #include <QStringList>
 
+#include "Zel_MemoryLimits.h"
 #include "Zel_PropertyKeyInfo.h"
 #include "Zel_PropertyList.h"
 
@@ -40,8 +41,28 @@ class Zel_MemoryPropertyManager;
 
 namespace ZelMemory {
 
-// The longest asset name the server accepts, in UTF-16 code units.
-const int MaxNameLength = 128;
+// The server's limits (Zel_MemoryLimits.h), by their short names.
+using Zel_MemoryLimits::MaxDepth;
+using Zel_MemoryLimits::MaxNameLength;
+using Zel_MemoryLimits::MaxSettingsCount;
+using Zel_MemoryLimits::MaxSettingsKeyLength;
+using Zel_MemoryLimits::MaxSettingsLevels;
+using Zel_MemoryLimits::MaxSettingsSize;
+
+// The version of the tree file format that saveTree writes and loadTree reads.
+const int TreeFileVersion = 1;
+
+// The property key types this server defines. The library gives meaning only
+// to the two resolution types; the others describe the values' form.
+enum KeyType {
+    KeyTypeText = 1,
+    KeyTypeVideoResolution = 2,
+    KeyTypeAudioResolution = 3,
+    KeyTypeTimecode = 4,
+    KeyTypeDate = 5,
+    KeyTypeNumber = 6
+};
+inline bool isKnownKeyType(int type) { return type >= KeyTypeText && type <= KeyTypeNumber; }
 
 // The thirty permission flags of Zel_NodePermissions, one bit each, in the
 // order of that class.
@@ -130,6 +151,9 @@ struct Node {
     QList<Property> properties; // server order; Name and Mime Type live above
     Reservation reservation;
     QStringList children; // node IDs, in the order they were added
+    // The same children by name (names are unique among siblings). Kept by
+    // the tree's insertNode, attach, detach and rename.
+    QHash<QString, QString> childByName;
     QMap<QString, std::uint32_t> permissions; // user (or "*") -> bits
     QList<Marker> locators;
     QList<Marker> restrictions;
@@ -238,6 +262,12 @@ public:
     const Node* reservedByOther(const Node& node, const QString& user, bool below = true) const;
     // The child of parent named name (exact), or null.
     const Node* childNamed(const Node& parent, const QString& name) const;
+    // The levels above node: 0 for the root.
+    int depthOf(const Node& node) const;
+    // The levels of the subtree below node: 0 when it has no children.
+    int heightOf(const Node& node) const;
+    // The node whose media object ID is mobId, or null.
+    const Node* byMobId(const QString& mobId) const;
     // name, or "name 2", "name 3", ... whichever no child of parent has; the
     // name is shortened where the number would make it longer than the limit.
     QString uniqueChildName(const Node& parent, const QString& name) const;
@@ -253,7 +283,12 @@ public:
     Node& copySubtree(const Node& source, Node& target, const QString& name);
     // Removes node and its subtree; the node IDs removed are appended to removed.
     void removeSubtree(const QString& id, QStringList* removed);
+    // Takes node out of its parent's children (it keeps its subtree).
     void detach(Node& node);
+    // Puts a detached node at the end of parent's children.
+    void attach(Node& node, Node& parent);
+    // Renames node, keeping its parent's index of names current.
+    void rename(Node& node, const QString& name);
 
     // --- Change reports. ---
     void addObserver(const boost::shared_ptr<Observer>& observer);

@@ -126,6 +126,8 @@ QString errorCodeName(int code)
     case Zel_MemoryErrorCodes::NotMedia: return QStringLiteral("NotMedia");
     case Zel_MemoryErrorCodes::ValueChanged: return QStringLiteral("ValueChanged");
     case Zel_MemoryErrorCodes::InvalidMedia: return QStringLiteral("InvalidMedia");
+    case Zel_MemoryErrorCodes::TooDeep: return QStringLiteral("TooDeep");
+    case Zel_MemoryErrorCodes::MobIDExists: return QStringLiteral("MobIDExists");
     }
     return QStringLiteral("code");
 }

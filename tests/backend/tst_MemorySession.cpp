@@ -5,6 +5,7 @@
 #include "Zel_Dependency.h"
 #include "Zel_DependencySPList.h"
 #include "Zel_GetNodeReq.h"
+#include "Zel_MemoryLimits.h"
 #include "Zel_Property.h"
 #include "Zel_SettingList.h"
 
@@ -19,7 +20,7 @@ TEST_F(Zel_MemorySessionTest, RequestsBeforeLoginFailAndWrongPasswordIsRejected)
     boost::shared_ptr<Zel_MemorySession> anonymous = newSession(QString());
     auto node = rec<NodeRec>();
     run(anonymous->makeGetNodeReqSP(mk(m(Mayor)), node), anonymous);
-    EXPECT_EQ((QStringList{QStringLiteral("fail 1005"), QStringLiteral("finished")}), node->log);
+    EXPECT_EQ((QStringList{QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::NotLoggedIn), QStringLiteral("finished")}), node->log);
 
     auto login = rec<LoginRec>();
     run(anonymous->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("wrong"), boost::shared_ptr<Zel_LoginCredentials>(), login),
@@ -313,7 +314,8 @@ TEST_F(Zel_MemorySessionTest, FailuresAreDataAndLeaveTheTreeUnchanged)
     // A deletion of several assets: the denied one is reported, nothing else changes.
     auto many = rec<DeleteRec>();
     run(session->makeDeleteReqSP(QStringList{QStringLiteral("zel-mem://C-ELECTION"), QStringLiteral("zel-mem://NOPE")}, true, true, many));
-    EXPECT_EQ((QStringList{QStringLiteral("fail 1003"), QStringLiteral("fail 1001"), QStringLiteral("assets 0"),
+    EXPECT_EQ((QStringList{QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::PermissionDenied),
+                           QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::UnknownMoniker), QStringLiteral("assets 0"),
                            QStringLiteral("records 0"), QStringLiteral("finished")}),
               many->log);
 
@@ -436,7 +438,7 @@ TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
     mobs.add(Zel_MobDesc(QLatin1String(MayorMob), QStringLiteral("/x/again.mxf"), QString()));
     auto checkin = rec<CheckinRec>();
     run(session->makeCheckinReqSP(mobs, mk(m(Footage)), checkin));
-    EXPECT_EQ((QStringList{QStringLiteral("ok checked in as \"storm\""), QStringLiteral("fail 1019"), QStringLiteral("finished")}),
+    EXPECT_EQ((QStringList{QStringLiteral("ok checked in as \"storm\""), QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::InvalidMedia), QStringLiteral("finished")}),
               checkin->log);
     ASSERT_EQ(1, checkin->nodes.size());
     const QString storm = checkin->nodes[0]->getMoniker();
@@ -450,7 +452,7 @@ TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
     updates.add(Zel_MobDesc(QStringLiteral("no-such-mob"), QStringLiteral("/x.mxf"), QString()));
     auto update = rec<CheckinUpdateRec>();
     run(session->makeCheckinUpdateReqSP(updates, update));
-    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("fail 1016"), QStringLiteral("finished")}), update->log);
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::NotFound), QStringLiteral("finished")}), update->log);
 
     boost::shared_ptr<Zel_MobID> mayorMob(new Zel_MobID(QLatin1String(MayorMob)));
     auto mobNode = rec<MobNodeRec>();
@@ -464,7 +466,7 @@ TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
     dnd.add(Zel_MobID(QStringLiteral("missing")));
     auto dragged = rec<MobBinaryDnDRec>();
     run(session->makeMobBinaryDnDReqSP(dnd, dragged));
-    EXPECT_EQ((QStringList{QStringLiteral("ok ") + QLatin1String(MayorMob), QStringLiteral("fail 1016"), QStringLiteral("finished")}),
+    EXPECT_EQ((QStringList{QStringLiteral("ok ") + QLatin1String(MayorMob), QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::NotFound), QStringLiteral("finished")}),
               dragged->log);
     auto head = rec<HeadframeRec>();
     run(session->makeMobHeadframeReqSP(mayorMob, head));
@@ -482,7 +484,8 @@ TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
                            QStringLiteral("local media ") + QLatin1String(MayorMob), QStringLiteral("assets 2"),
                            QStringLiteral("records 2"), QStringLiteral("finished")}),
               deletion->log);
-    EXPECT_EQ((QList<int>{1003, 1003, 1003, 1003}), deletion->codes);
+    EXPECT_EQ((QList<int>{Zel_MemoryErrorCodes::PermissionDenied, Zel_MemoryErrorCodes::PermissionDenied,
+                          Zel_MemoryErrorCodes::PermissionDenied, Zel_MemoryErrorCodes::PermissionDenied}), deletion->codes);
     boost::shared_ptr<Zel_MemorySession> admin = newSession(QStringLiteral("admin"));
     auto adminDeletion = rec<DeleteRec>();
     run(admin->makeDeleteReqSP(QStringList{m(CityHall), QStringLiteral("zel-mem://C-CROWD")}, true, false, adminDeletion), admin);
@@ -696,4 +699,197 @@ TEST_F(Zel_MemorySessionTest, NamesTheServerMakesStayWithinTheNameLimit)
         run(session->makeRenameNodeReqSP(mk(node->getMoniker()), node->getName(), rename));
         EXPECT_TRUE(rename->codes.isEmpty()) << node->getName().toStdString();
     }
+}
+
+TEST_F(Zel_MemorySessionTest, FoldersNestOnlyToTheDepthLimitAndSuchATreeLoadsBack)
+{
+    using Zel_MemoryLimits::MaxDepth;
+    // A chain of bins below Footage (depth 2), the last at the limit.
+    QStringList chain{m(News), m(Footage)};
+    for (int depth = 3; depth <= MaxDepth; ++depth) {
+        auto created = rec<CreateFolderRec>();
+        run(session->makeCreateFolderReqSP(mk(chain.last()), QStringLiteral("Level %1").arg(depth), created));
+        ASSERT_EQ(1, created->nodes.size()) << "depth " << depth << ": " << created->messages.value(0).toStdString();
+        chain << created->nodes[0]->getMoniker();
+    }
+    const QString deepest = chain.last();
+    const QString aboveDeepest = chain.at(chain.size() - 2);
+    const QList<int> tooDeep{Zel_MemoryErrorCodes::TooDeep};
+
+    auto folder = rec<CreateFolderRec>();
+    run(session->makeCreateFolderReqSP(mk(deepest), QStringLiteral("Below"), folder));
+    EXPECT_EQ(tooDeep, folder->codes);
+    EXPECT_EQ(QStringLiteral("Nodes added to \"Level 128\" (%1) would lie 129 levels below the root; the server allows at most 128.")
+                  .arg(deepest),
+              folder->messages.value(0));
+    auto unique = rec<CreateFolderUniqueRec>();
+    run(session->makeCreateFolderUniqueReqSP(mk(deepest), QStringLiteral("Below"), unique));
+    EXPECT_EQ(tooDeep, unique->codes);
+    auto node = rec<NodeRec>();
+    run(session->makeCreateNodeUniqueReqSP(mk(deepest), QStringLiteral("Clip"), Zel_PropertyList(), node));
+    EXPECT_EQ(tooDeep, node->codes);
+    auto bin = rec<CheckinRec>();
+    run(session->makeCheckinLocalBinReqSP(QStringLiteral("/bins/Below.avb"), mk(deepest), bin));
+    EXPECT_EQ(tooDeep, bin->codes);
+
+    // Effects holds two effects: with them it is two levels high.
+    auto moved = rec<MoveNodeRec>();
+    run(session->makeMoveNodeReqSP(mk(m("B-EFFECTS")), mk(aboveDeepest), moved));
+    EXPECT_EQ(tooDeep, moved->codes);
+    auto copied = rec<CopyRec>();
+    run(session->makeCopyNodeReqSP(mk(m("B-EFFECTS")), mk(aboveDeepest), copied));
+    EXPECT_EQ(tooDeep, copied->codes);
+    auto clip = rec<MoveNodeRec>();
+    run(session->makeMoveNodeReqSP(mk(m(Mayor)), mk(deepest), clip));
+    EXPECT_EQ(tooDeep, clip->codes);
+    // One level higher they fit, the effects at the limit.
+    auto copiedHigher = rec<CopyRec>();
+    run(session->makeCopyNodeReqSP(mk(m("B-EFFECTS")), mk(chain.at(chain.size() - 3)), copiedHigher));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Effects -> Effects"), QStringLiteral("finished")}), copiedHigher->log);
+    auto movedHigher = rec<MoveNodeRec>();
+    run(session->makeMoveNodeReqSP(mk(m("B-EFFECTS")), mk(chain.at(chain.size() - 4)), movedHigher));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Effects"), QStringLiteral("finished")}), movedHigher->log);
+
+    // Everything the requests built saves and loads back the same.
+    const QByteArray saved = tree->toJson();
+    QString error;
+    boost::shared_ptr<Zel_MemoryTree> again = Zel_MemoryTree::fromJson(saved, QStringLiteral("deep.json"), &error);
+    ASSERT_TRUE(again) << error.toStdString();
+    EXPECT_EQ(tree->nodeCount(), again->nodeCount());
+    EXPECT_EQ(saved, again->toJson());
+    QString path = QStringLiteral("/Evening News/Footage");
+    for (int depth = 3; depth <= MaxDepth; ++depth)
+        path += QStringLiteral("/Level %1").arg(depth);
+    EXPECT_EQ(deepest, again->monikerAt(path));
+
+    // Deleting the chain takes its whole subtree.
+    const int before = tree->nodeCount();
+    auto deleted = rec<BoolRec>();
+    run(session->makeDeleteNodeReqSP(mk(chain.at(2)), deleted));
+    EXPECT_EQ((QStringList{QStringLiteral("ok true"), QStringLiteral("finished")}), deleted->log);
+    EXPECT_EQ(before - (MaxDepth - 2) - 3 - 3, tree->nodeCount()); // the chain, the copied and the moved effects
+}
+
+TEST_F(Zel_MemorySessionTest, CreateNodeUniqueRefusesAMediaObjectIdInUse)
+{
+    const QByteArray before = tree->toJson();
+    Zel_PropertyList props;
+    props.append(Zel_Property(QStringLiteral("MobID"), QLatin1String(MayorMob), QString()));
+    auto taken = rec<NodeRec>();
+    run(session->makeCreateNodeUniqueReqSP(mk(m(Footage)), QStringLiteral("Mayor again"), props, taken));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::MobIDExists}, taken->codes);
+    EXPECT_EQ(QStringLiteral("The media object ID \"%1\" belongs to \"Interview Mayor\" (%2) already.")
+                  .arg(QLatin1String(MayorMob), m(Mayor)),
+              taken->messages.value(0));
+    EXPECT_EQ(before, tree->toJson());
+
+    const QString fresh = QStringLiteral("060a2b340101010101010f00.13000000.9999");
+    props.clear();
+    props.append(Zel_Property(QStringLiteral("MobID"), fresh, QString()));
+    auto first = rec<NodeRec>();
+    run(session->makeCreateNodeUniqueReqSP(mk(m(Footage)), QStringLiteral("New clip"), props, first));
+    ASSERT_EQ(1, first->nodes.size());
+    EXPECT_EQ(fresh, first->nodes[0]->getMobID().toZelString());
+    auto second = rec<NodeRec>();
+    run(session->makeCreateNodeUniqueReqSP(mk(m(Sequences)), QStringLiteral("New clip"), props, second));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::MobIDExists}, second->codes);
+}
+
+namespace {
+
+QString repeated(const QString& text, int times)
+{
+    QString result;
+    result.reserve(text.size() * times);
+    for (int i = 0; i < times; ++i)
+        result += text;
+    return result;
+}
+
+} // namespace
+
+TEST_F(Zel_MemorySessionTest, SettingsBeyondTheLimitsAreRefusedAndStoredSettingsReadBack)
+{
+    using namespace Zel_MemoryLimits;
+    const QList<int> invalid{Zel_MemoryErrorCodes::InvalidArgument};
+    auto setUser = [this](const QString& xml) {
+        auto set = rec<SetUserSettingsRec>();
+        run(session->makeSetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsGeneral, xml, set));
+        return set;
+    };
+    auto general = [this]() {
+        auto get = rec<UserSettingsRec>();
+        run(session->makeGetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsGeneral, get));
+        EXPECT_EQ(2, get->log.size());
+        return get->log.value(0);
+    };
+
+    // 20,000 levels (140 KB): refused before anything is stored, so reading
+    // the settings back still works.
+    const QString deep = QStringLiteral("<S>") + repeated(QStringLiteral("<a>"), 20000) + QStringLiteral("v")
+        + repeated(QStringLiteral("</a>"), 20000) + QStringLiteral("</S>");
+    auto deepUser = setUser(deep);
+    EXPECT_EQ(invalid, deepUser->codes);
+    EXPECT_EQ(QStringLiteral("The settings nest deeper than 64 levels below the root (line 1, column 198)."),
+              deepUser->messages.value(0))
+        << deepUser->messages.value(0).toStdString();
+    auto deepApp = rec<SetApplicationSettingsRec>();
+    run(session->makeSetApplicationSettingsReqSP(QStringLiteral("zel-demo"), deep, deepApp));
+    EXPECT_EQ(invalid, deepApp->codes);
+    auto deepDocument = rec<SaveSettingsRec>();
+    run(session->makeSaveSettingsReqSP(QStringLiteral("Deep"), deep, deepDocument));
+    EXPECT_EQ(invalid, deepDocument->codes);
+    EXPECT_TRUE(general().contains(QStringLiteral("<TrackHeight>48</TrackHeight>")));
+
+    // A document longer than the size limit.
+    const QString huge = QStringLiteral("<S>") + repeated(QStringLiteral("<k>value</k>"), MaxSettingsSize / 12 + 1)
+        + QStringLiteral("</S>");
+    auto hugeUser = setUser(huge);
+    EXPECT_EQ(invalid, hugeUser->codes);
+    EXPECT_EQ(QStringLiteral("The settings document has %1 characters; the server accepts at most 1048576.").arg(huge.size()),
+              hugeUser->messages.value(0));
+
+    // A short document whose keys would come to more than the size limit:
+    // each leaf's key repeats a long parent's name.
+    QString wide = QStringLiteral("<S><") + QString(1000, QLatin1Char('p')) + QLatin1Char('>');
+    for (int i = 0; i < 1100; ++i)
+        wide += QStringLiteral("<k%1/>").arg(i);
+    wide += QStringLiteral("</") + QString(1000, QLatin1Char('p')) + QStringLiteral("></S>");
+    auto wideUser = setUser(wide);
+    EXPECT_EQ(invalid, wideUser->codes);
+    EXPECT_TRUE(wideUser->messages.value(0).startsWith(
+        QStringLiteral("The settings keys and values come to more than 1048576 characters (line 1, column ")))
+        << wideUser->messages.value(0).toStdString();
+
+    // A key longer than the key limit, and more settings than the count limit.
+    auto longKey = setUser(QStringLiteral("<S><") + QString(MaxSettingsKeyLength + 1, QLatin1Char('k')) + QStringLiteral("/></S>"));
+    EXPECT_EQ(invalid, longKey->codes);
+    EXPECT_EQ(QStringLiteral("The settings have a key longer than 1024 characters (line 1, column 1031)."), longKey->messages.value(0))
+        << longKey->messages.value(0).toStdString();
+    QString many = QStringLiteral("<S>");
+    for (int i = 0; i <= MaxSettingsCount; ++i)
+        many += QStringLiteral("<k%1/>").arg(i);
+    many += QStringLiteral("</S>");
+    auto manyUser = setUser(many);
+    EXPECT_EQ(invalid, manyUser->codes);
+    EXPECT_TRUE(manyUser->messages.value(0).startsWith(QStringLiteral("The settings hold more than 10000 keys (line 1, column ")))
+        << manyUser->messages.value(0).toStdString();
+    EXPECT_TRUE(general().contains(QStringLiteral("<TrackHeight>48</TrackHeight>")));
+
+    // At the limits the settings are stored and read back: a key of 64
+    // levels; a later leaf with the same key replaces the value in place;
+    // white space alone is no value.
+    QString open;
+    QString close;
+    for (int level = 1; level <= MaxSettingsLevels; ++level) {
+        open += QStringLiteral("<l%1>").arg(level);
+        close.prepend(QStringLiteral("</l%1>").arg(level));
+    }
+    auto atLimit = setUser(QStringLiteral("<S><a><b>1</b><c>2</c><b>3</b></a><d> </d>") + open + QStringLiteral("deep") + close
+                           + QStringLiteral("</S>"));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), atLimit->log);
+    const QString back = general();
+    EXPECT_TRUE(back.contains(QStringLiteral("<a>\n  <b>3</b>\n  <c>2</c>\n </a>\n <d></d>\n"))) << back.toStdString();
+    EXPECT_TRUE(back.contains(QStringLiteral("<l64>deep</l64>"))) << back.toStdString();
+    EXPECT_FALSE(back.contains(QStringLiteral("TrackHeight")));
 }

@@ -1,8 +1,11 @@
 // The tree file: the bundled sample, saving and loading back, and malformed
 // files rejected with the file's name and the position of the fault.
+#include "Zel_MemoryLimits.h"
 #include "Zel_MemoryTree.h"
 
 #include <QDir>
+#include <QElapsedTimer>
+#include <QSet>
 #include <QFile>
 #include <QTemporaryDir>
 
@@ -131,4 +134,202 @@ TEST(Zel_MemoryTreeTest, MissingFileIsNamedInTheMessage)
     EXPECT_TRUE(error.startsWith(QStringLiteral("/nonexistent/tree.json: cannot be read: "))) << error.toStdString();
     // Without an error pointer the failure is still an empty result, not a crash.
     EXPECT_FALSE(Zel_MemoryTree::fromJson("{", QStringLiteral("x.json")));
+}
+
+namespace {
+
+// minimal with the project's members replaced (the text after "mimeType":"project").
+QByteArray withProject(const QByteArray& members)
+{
+    QByteArray json = minimal;
+    json.replace("\"mimeType\":\"project\"}", "\"mimeType\":\"project\"" + members + "}");
+    return json;
+}
+
+// A root folder with the given number of bins in it.
+QByteArray wideTree(int children)
+{
+    QByteArray json = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":[\n";
+    for (int i = 0; i < children; ++i) {
+        if (i > 0)
+            json += ",\n";
+        json += "{\"name\":\"Bin " + QByteArray::number(i) + "\",\"mimeType\":\"bin\"}";
+    }
+    json += "]}}";
+    return json;
+}
+
+// A chain of bins, the deepest at the given depth below the root.
+QByteArray deepTree(int depth)
+{
+    QByteArray json = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\"";
+    for (int i = 1; i <= depth; ++i)
+        json += ",\"children\":[{\"name\":\"L" + QByteArray::number(i) + "\",\"mimeType\":\"bin\"";
+    for (int i = 1; i <= depth; ++i)
+        json += "}]";
+    json += "}}";
+    return json;
+}
+
+} // namespace
+
+TEST(Zel_MemoryTreeTest, NamesWithSlashOrBeyondTheNameLimitAreRefused)
+{
+    QByteArray json = minimal;
+    json.replace("\"name\":\"Project\"", "\"name\":\"Pro/ject\"");
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[0].name: \"Pro/ject\" contains \"/\", which separates the names of a path"),
+              loadError(json));
+
+    const QByteArray longest(Zel_MemoryLimits::MaxNameLength, 'x');
+    json = minimal;
+    json.replace("\"name\":\"Project\"", "\"name\":\"" + longest + "\"");
+    EXPECT_TRUE(Zel_MemoryTree::fromJson(json, QStringLiteral("tree.json")));
+    json = minimal;
+    json.replace("\"name\":\"Project\"", "\"name\":\"" + longest + "y\"");
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[0].name: longer than the 128 characters a name may have"), loadError(json));
+}
+
+TEST(Zel_MemoryTreeTest, SecondNodeWithAMediaObjectIdIsRefused)
+{
+    const QByteArray clips = ",\"children\":[{\"id\":\"A\",\"name\":\"A\",\"mimeType\":\"masterclip\",\"mobID\":\"M-1\"},"
+                             "{\"id\":\"B\",\"name\":\"B\",\"mimeType\":\"masterclip\",\"mobID\":\"M-2\"}]";
+    EXPECT_TRUE(Zel_MemoryTree::fromJson(withProject(clips), QStringLiteral("tree.json")));
+    QByteArray twice = clips;
+    twice.replace("M-2", "M-1");
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[0].children[1].mobID: a second node with the media object ID \"M-1\""),
+              loadError(withProject(twice)));
+}
+
+TEST(Zel_MemoryTreeTest, DependencyOnNoNodeIsRefused)
+{
+    // A dependency may name a node that comes later in the file.
+    const QByteArray clips = ",\"children\":[{\"id\":\"A\",\"name\":\"A\",\"mimeType\":\"sequence\","
+                             "\"dependencies\":[{\"moniker\":\"zel-mem://B\"}]},"
+                             "{\"id\":\"B\",\"name\":\"B\",\"mimeType\":\"masterclip\"}]";
+    EXPECT_TRUE(Zel_MemoryTree::fromJson(withProject(clips), QStringLiteral("tree.json")));
+    QByteArray dangling = clips;
+    dangling.replace("zel-mem://B", "zel-mem://Z");
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[0].children[0].dependencies[0].moniker: no node has the moniker \"zel-mem://Z\""),
+              loadError(withProject(dangling)));
+}
+
+TEST(Zel_MemoryTreeTest, UnknownVersionIsRefused)
+{
+    QByteArray json = minimal;
+    json.replace("{\"users\"", "{\"version\":1,\"users\"");
+    EXPECT_TRUE(Zel_MemoryTree::fromJson(json, QStringLiteral("tree.json")));
+    json = minimal;
+    json.replace("{\"users\"", "{\"version\":2,\"users\"");
+    EXPECT_EQ(QStringLiteral("tree.json: version: unknown version 2 (this server reads version 1)"), loadError(json));
+    json = minimal;
+    json.replace("{\"users\"", "{\"version\":\"1\",\"users\"");
+    EXPECT_EQ(QStringLiteral("tree.json: version: expected a whole number"), loadError(json));
+}
+
+TEST(Zel_MemoryTreeTest, UnknownKeyTypeIsRefused)
+{
+    QByteArray json = minimal;
+    json.replace("{\"users\"", "{\"propertyKeys\":[{\"key\":\"Tape\",\"type\":6},{\"key\":\"Odd\",\"type\":9}],\"users\"");
+    EXPECT_EQ(QStringLiteral("tree.json: propertyKeys[1].type: unknown key type 9 (expected 1 text, 2 video resolution, "
+                             "3 audio resolution, 4 timecode, 5 date or 6 number)"),
+              loadError(json));
+    json.replace("\"type\":9", "\"type\":0");
+    EXPECT_EQ(QStringLiteral("tree.json: propertyKeys[1].type: unknown key type 0 (expected 1 text, 2 video resolution, "
+                             "3 audio resolution, 4 timecode, 5 date or 6 number)"),
+              loadError(json));
+}
+
+TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
+{
+    // A second "children" would silently replace the first subtree.
+    const QByteArray json = "{\"users\":[{\"name\":\"u\"}],\n"
+                            "\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\n"
+                            " \"children\":[{\"id\":\"P\",\"name\":\"Project\",\"mimeType\":\"project\"}],\n"
+                            " \"children\":[]}}";
+    EXPECT_EQ(QStringLiteral("tree.json:4:2: a second member named \"children\" in one object (the first is at 3:2)"),
+              loadError(json));
+
+    // Names are compared as the reader sees them, escapes resolved; columns
+    // count characters.
+    const QByteArray escaped = "{\"root\":{\"id\":\"R\",\"name\":\"\xc3\xa9t\xc3\xa9\",\"n\\u0061me\":\"Root\",\"mimeType\":\"workspace\"}}";
+    EXPECT_EQ(QStringLiteral("tree.json:1:32: a second member named \"name\" in one object (the first is at 1:19)"),
+              loadError(escaped));
+
+    // A text broken near the second name is a syntax error, not a duplicate.
+    const QString broken = loadError("{\"root\":{}, \"root\" {}}");
+    EXPECT_TRUE(broken.startsWith(QStringLiteral("tree.json:1:")) && !broken.contains(QStringLiteral("second member")))
+        << broken.toStdString();
+
+    // The same name in different objects, and names as values, are fine.
+    EXPECT_TRUE(Zel_MemoryTree::fromJson(
+        "{\"root\":{\"id\":\"id\",\"name\":\"name\",\"mimeType\":\"workspace\",\"children\":["
+        "{\"id\":\"A\",\"name\":\"children\",\"mimeType\":\"bin\"},{\"id\":\"B\",\"name\":\"B\",\"mimeType\":\"bin\"}]}}",
+        QStringLiteral("tree.json")));
+}
+
+TEST(Zel_MemoryTreeTest, GeneratedIdsAvoidIdsGivenLaterInTheFile)
+{
+    const QByteArray json = "{\"root\":{\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":["
+                            "{\"name\":\"First\",\"mimeType\":\"project\"},"
+                            "{\"id\":\"N000001\",\"name\":\"Second\",\"mimeType\":\"project\"},"
+                            "{\"moniker\":\"zel-mem://N000003\",\"name\":\"Third\",\"mimeType\":\"project\"}]}}";
+    QString error;
+    boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::fromJson(json, QStringLiteral("tree.json"), &error);
+    ASSERT_TRUE(tree) << error.toStdString();
+    EXPECT_EQ(4, tree->nodeCount());
+    EXPECT_EQ(QStringLiteral("zel-mem://N000001"), tree->monikerAt(QStringLiteral("/Second")));
+    EXPECT_EQ(QStringLiteral("zel-mem://N000003"), tree->monikerAt(QStringLiteral("/Third")));
+    const QSet<QString> monikers{tree->rootMoniker(), tree->monikerAt(QStringLiteral("/First")),
+                                 tree->monikerAt(QStringLiteral("/Second")), tree->monikerAt(QStringLiteral("/Third"))};
+    EXPECT_EQ(4, monikers.size());
+}
+
+TEST(Zel_MemoryTreeTest, NodesDeeperThanTheDepthLimitAreRefused)
+{
+    using Zel_MemoryLimits::MaxDepth;
+    QString error;
+    boost::shared_ptr<Zel_MemoryTree> deepest = Zel_MemoryTree::fromJson(deepTree(MaxDepth), QStringLiteral("tree.json"), &error);
+    ASSERT_TRUE(deepest) << error.toStdString();
+    EXPECT_EQ(MaxDepth + 1, deepest->nodeCount());
+
+    QString path = QStringLiteral("root");
+    for (int i = 0; i <= MaxDepth; ++i)
+        path += QStringLiteral(".children[0]");
+    EXPECT_EQ(QStringLiteral("tree.json: %1: lies 129 levels below the root; the server allows at most 128").arg(path),
+              loadError(deepTree(MaxDepth + 1)));
+}
+
+TEST(Zel_MemoryTreeTest, SettingsBeyondTheSettingsLimitsAreRefused)
+{
+    QByteArray key = "a";
+    for (int i = 1; i < Zel_MemoryLimits::MaxSettingsLevels; ++i)
+        key += ".a";
+    QByteArray json = minimal;
+    json.replace("{\"users\"", "{\"settings\":{\"workgroup\":{\"" + key + "\":\"v\"}},\"users\"");
+    EXPECT_TRUE(Zel_MemoryTree::fromJson(json, QStringLiteral("tree.json")));
+    json.replace(key, key + ".a");
+    EXPECT_EQ(QStringLiteral("tree.json: settings.workgroup.%1.a: a settings key of more than 64 levels").arg(QLatin1String(key)),
+              loadError(json));
+}
+
+TEST(Zel_MemoryTreeTest, LoadingTimeGrowsLinearlyWithTheChildrenOfAFolder)
+{
+    // Ten times the children must cost far less than a hundred times the
+    // time (a quadratic load); the best of three runs each.
+    auto bestLoad = [](const QByteArray& json, int nodes) {
+        qint64 best = -1;
+        for (int run = 0; run < 3; ++run) {
+            QElapsedTimer timer;
+            timer.start();
+            boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::fromJson(json, QStringLiteral("wide.json"));
+            const qint64 elapsed = timer.nsecsElapsed();
+            EXPECT_TRUE(tree && tree->nodeCount() == nodes);
+            if (best < 0 || elapsed < best)
+                best = elapsed;
+        }
+        return static_cast<double>(best);
+    };
+    const double small = bestLoad(wideTree(20000), 20001);
+    const double large = bestLoad(wideTree(200000), 200001);
+    EXPECT_LT(large / small, 25.0) << "20,000 children: " << small / 1e6 << " ms; 200,000: " << large / 1e6 << " ms";
 }
