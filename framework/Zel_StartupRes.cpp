@@ -1,6 +1,8 @@
 #include "Zel_StartupRes.h"
 
-#include "zel_resultitems_p.h"
+#include "Zel_Error.h"
+
+#include <cxxabi.h>
 
 #include <utility>
 
@@ -23,13 +25,17 @@ bool Zel_StartupRes::deliverNext()
             else
                 mCallback->succeeded();
         }
+    } catch (abi::__forced_unwind&) {
+        throw; // thread cancellation must go on unwinding
     } catch (...) {
         // A handler's exception is discarded.
     }
     return false;
 }
 
+// An empty pointer leaves no record: nothing is delivered until a record is
+// set again, rather than a made-up success.
 void Zel_StartupRes::setError(boost::shared_ptr<Zel_Error> error)
 {
-    mError = ZelResults::errorRecord(std::move(error));
+    mError = std::move(error);
 }
