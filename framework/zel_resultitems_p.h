@@ -9,6 +9,8 @@
 #include <boost/make_shared.hpp>
 #include <boost/shared_ptr.hpp>
 
+#include <cxxabi.h>
+
 namespace ZelResults {
 
 // The error record to store with an answer: the one given or, when the backend
@@ -32,7 +34,9 @@ inline bool reportsError(const boost::shared_ptr<Zel_Error>& error)
 // last item of a final result, calls finished(). The cursor moves before the
 // handler runs, and an exception from a handler (or from finished()) is
 // discarded, so the remaining items and the end notice still follow. True
-// while items remain; nothing thrown here reaches the engine.
+// while items remain; nothing thrown here reaches the engine, except the
+// exception that cancels a thread (abi::__forced_unwind), which must go on
+// unwinding.
 template <class Callback, class Items, class Cursor, class Deliver>
 bool deliverListItem(const Orv_Result& result, const boost::shared_ptr<Callback>& callback, const Items& items,
                      Cursor& cursor, Deliver deliver)
@@ -42,6 +46,8 @@ bool deliverListItem(const Orv_Result& result, const boost::shared_ptr<Callback>
             const auto& item = items[static_cast<std::size_t>(cursor++)];
             try {
                 deliver(*callback, item);
+            } catch (abi::__forced_unwind&) {
+                throw;
             } catch (...) {
             }
             if (cursor < items.size())
@@ -50,9 +56,13 @@ bool deliverListItem(const Orv_Result& result, const boost::shared_ptr<Callback>
         if (callback && result.isFinalResult()) {
             try {
                 callback->finished();
+            } catch (abi::__forced_unwind&) {
+                throw;
             } catch (...) {
             }
         }
+    } catch (abi::__forced_unwind&) {
+        throw;
     } catch (...) {
     }
     return false;
