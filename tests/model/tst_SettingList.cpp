@@ -429,3 +429,38 @@ TEST(Zel_SettingListTest, NameRuleKeepsExactlyTheNamesBothQtReadersReadBack)
                                        .toXML("R"));
     EXPECT_EQ(outline(root), "ʻōlelo(ʻāina=1) ՙx=2 Größe(日本=3) _-(x=4)");
 }
+
+TEST(Zel_SettingListTest, KeysOfMoreThanSixtyFourLevelsAreLeftOutWithOneTraceLine)
+{
+    // 64 levels are kept; 65 and 50,000 are left out like other unusable
+    // keys, and nothing deep reaches the DOM, whose writer recurses per level.
+    const auto levels = [](int count) {
+        QStringList parts;
+        for (int i = 0; i < count; ++i)
+            parts.append(QStringLiteral("a"));
+        return parts.join(QLatin1Char('.'));
+    };
+    TraceCapture trace;
+    Zel_SettingList list;
+    list.append(Zel_Setting(levels(64), "deepest"));
+    list.append(Zel_Setting(levels(65), "too deep"));
+    list.append(Zel_Setting(levels(50000), "far too deep"));
+    list.append(Zel_Setting("tail", "kept"));
+    const QDomElement root = parse(list.toXML("R"));
+
+    QDomElement leaf = root;
+    int depth = 0;
+    while (!leaf.firstChildElement("a").isNull()) {
+        leaf = leaf.firstChildElement("a");
+        ++depth;
+    }
+    EXPECT_EQ(64, depth);
+    EXPECT_EQ(QStringLiteral("deepest"), leaf.text());
+    EXPECT_EQ(QStringLiteral("kept"), root.lastChildElement().text());
+    EXPECT_EQ(2, root.childNodes().count());
+
+    // The line shows the first 64 levels of the key.
+    const std::string shown = "ZEL: Zel_SettingList::toXML: key \"" + str(levels(64)) + "...\" has ";
+    EXPECT_EQ(trace.orvLines(), (std::vector<std::string>{shown + "65 levels, more than 64; setting left out",
+                                                          shown + "50000 levels, more than 64; setting left out"}));
+}
