@@ -5,8 +5,9 @@
 // becomes nested elements: intermediate levels are shared between keys with a
 // common prefix, the last level is always a new element (a key given twice
 // gives two sibling elements). The root carries "version" ("1.0"),
-// "modifydate" (local time, Qt::TextDate) and "modifydateInt" (seconds since
-// 1970-01-01 00:00 UTC):
+// "modifydate" (local time as Qt 5's Qt::TextDate writes it, with the system
+// locale's short day and month names, in both Qt builds) and "modifydateInt"
+// (seconds since 1970-01-01 00:00 UTC):
 //
 //     Zel_SettingList list;
 //     list.append(Zel_Setting("General.Language", "en"));

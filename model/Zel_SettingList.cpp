@@ -200,7 +200,7 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
     const QDateTime moment = modifyDate.isValid() ? modifyDate : QDateTime::currentDateTime();
     root.setAttribute(QStringLiteral("version"), QStringLiteral("1.0"));
     root.setAttribute(QStringLiteral("modifydate"),
-                      ZelXml::xmlCharsOnly(moment.toLocalTime().toString(Qt::TextDate)));
+                      ZelXml::xmlCharsOnly(ZelCompat::systemTextDate(moment.toLocalTime())));
     root.setAttribute(QStringLiteral("modifydateInt"), QString::number(ZelCompat::toTimeT(moment)));
 
     return document.toString(1);
