@@ -1,30 +1,17 @@
 #include "Zel_Res.h"
 
+#include "zel_resultitems_p.h"
+
 #include "Orv_ResultsCB.h"
 
-#include <cxxabi.h>
-
 namespace {
-
-// Runs one delivery operation and discards what it throws, except the
-// exception that cancels a thread, which must go on unwinding.
-template <class Operation>
-void discardingExceptions(Operation operation)
-{
-    try {
-        operation();
-    } catch (abi::__forced_unwind&) {
-        throw;
-    } catch (...) {
-    }
-}
 
 // Tells a final result's callback that the request has delivered its last
 // answer; the answer of the delivery call is then false.
 bool finishIfFinal(Zel_Res& result)
 {
     if (result.isFinalResult())
-        discardingExceptions([&result] { result.doFinished(); });
+        ZelResults::discardExceptions([&result] { result.doFinished(); });
     return false;
 }
 
@@ -57,19 +44,19 @@ bool Zel_Res::deliverNext()
 
 bool Zel_Res::deliverNextStep(AnswerCursor cursor)
 {
+    bool have = false;
     bool failed = false;
-    try {
-        if (!haveResults())
-            return finishIfFinal(*this);
-        failed = isCurrentResultError();
-    } catch (abi::__forced_unwind&) {
-        throw;
-    } catch (...) {
+    if (ZelResults::discardExceptions([&] {
+            have = haveResults();
+            if (have)
+                failed = isCurrentResultError();
+        }))
         return endAfterThrowingQuestion(*this, cursor, true);
-    }
+    if (!have)
+        return finishIfFinal(*this);
 
     // A handler's exception must not stop delivery of the other answers.
-    discardingExceptions([this, failed] {
+    ZelResults::discardExceptions([this, failed] {
         if (failed)
             doFailed();
         else
@@ -77,13 +64,8 @@ bool Zel_Res::deliverNextStep(AnswerCursor cursor)
     });
 
     bool more = false;
-    try {
-        more = haveResults();
-    } catch (abi::__forced_unwind&) {
-        throw;
-    } catch (...) {
+    if (ZelResults::discardExceptions([&] { more = haveResults(); }))
         return endAfterThrowingQuestion(*this, cursor, false);
-    }
     if (more)
         return true;
     return finishIfFinal(*this);

@@ -1,8 +1,6 @@
 #include "Zel_StartupRes.h"
 
-#include "Zel_Error.h"
-
-#include <cxxabi.h>
+#include "zel_resultitems_p.h"
 
 #include <utility>
 
@@ -18,18 +16,15 @@ Zel_StartupRes::~Zel_StartupRes() = default;
 
 bool Zel_StartupRes::deliverNext()
 {
-    try {
+    // A handler's exception is discarded.
+    ZelResults::discardExceptions([this] {
         if (mCallback && mError) {
             if (mError->isError())
                 mCallback->failed(mError);
             else
                 mCallback->succeeded();
         }
-    } catch (abi::__forced_unwind&) {
-        throw; // thread cancellation must go on unwinding
-    } catch (...) {
-        // A handler's exception is discarded.
-    }
+    });
     return false;
 }
 
