@@ -13,7 +13,7 @@
 // answers behind a cursor known to delivery (the library's own results) moves
 // past the current answer, so the next call sees the next one; any other
 // result ends there (a final one still calls the finished handler). The
-// exception that cancels a thread (abi::__forced_unwind) is never caught.
+// exception that cancels a thread (abi::__forced_unwind) is never swallowed.
 //
 // A concrete result implements the five protected-by-contract operations
 // haveResults, isCurrentResultError, doFailed, doSucceeded and doFinished and
