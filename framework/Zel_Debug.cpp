@@ -7,6 +7,11 @@
 
 #include <mutex>
 
+// The switch keeps the size and place of the plain bool it replaced.
+static_assert(sizeof(std::atomic<bool>) == sizeof(bool) && alignof(std::atomic<bool>) == alignof(bool),
+              "the trace switch must keep the layout of a bool");
+static_assert(std::atomic<bool>::is_always_lock_free, "the trace switch must not need a lock");
+
 boost::shared_ptr<Zel_Debug> Zel_Debug::mInstanceSP;
 
 Zel_Debug::Zel_Debug()
@@ -14,8 +19,17 @@ Zel_Debug::Zel_Debug()
 {
 }
 
-Zel_Debug::Zel_Debug(const Zel_Debug& other) = default;
-Zel_Debug& Zel_Debug::operator=(const Zel_Debug& other) = default;
+Zel_Debug::Zel_Debug(const Zel_Debug& other)
+    : mEnabled(other.mEnabled.load(std::memory_order_relaxed))
+{
+}
+
+Zel_Debug& Zel_Debug::operator=(const Zel_Debug& other)
+{
+    mEnabled.store(other.mEnabled.load(std::memory_order_relaxed), std::memory_order_relaxed);
+    return *this;
+}
+
 Zel_Debug::~Zel_Debug() = default;
 
 boost::shared_ptr<Zel_Debug> Zel_Debug::instance()
@@ -25,19 +39,21 @@ boost::shared_ptr<Zel_Debug> Zel_Debug::instance()
     return mInstanceSP;
 }
 
+// Relaxed: the switch orders nothing else; a thread sees a change soon, not
+// at a given point of its work.
 void Zel_Debug::setEnabled(bool enabled)
 {
-    mEnabled = enabled;
+    mEnabled.store(enabled, std::memory_order_relaxed);
 }
 
 bool Zel_Debug::getEnabled()
 {
-    return mEnabled;
+    return mEnabled.load(std::memory_order_relaxed);
 }
 
 void Zel_Debug::debug(const QString& source, const QString& text, int elapsedMs)
 {
-    if (!mEnabled)
+    if (!mEnabled.load(std::memory_order_relaxed))
         return;
 
     QString line = QStringLiteral("ZEL:");

@@ -163,6 +163,17 @@ Zel_DeleteRes::Zel_DeleteRes(const Zel_DeleteRes& other) = default;
 Zel_DeleteRes& Zel_DeleteRes::operator=(const Zel_DeleteRes& other) = default;
 Zel_DeleteRes::~Zel_DeleteRes() = default;
 
+bool Zel_DeleteRes::deliverNext()
+{
+    return deliverNextStep([](Zel_Res& result, bool skip) {
+        Zel_DeleteRes& self = static_cast<Zel_DeleteRes&>(result);
+        const bool inRange = self.mCursor >= 0 && self.mCursor < self.mItems.size();
+        if (skip && inRange)
+            ++self.mCursor;
+        return self.mCursor >= 0 && self.mCursor < self.mItems.size();
+    });
+}
+
 bool Zel_DeleteRes::haveResults()
 {
     return mItems.size() > mCursor;

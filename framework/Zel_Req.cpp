@@ -22,9 +22,11 @@ Zel_Req::Zel_Req(const Zel_Req& other)
 
 Zel_Req::~Zel_Req() = default;
 
+// The stored length counts, so that a NUL inside the name does not cut it.
 const QString Zel_Req::getName() const
 {
-    return QString::fromLatin1(name().c_str());
+    const std::string& stored = name();
+    return QString::fromLatin1(stored.data(), static_cast<int>(stored.size()));
 }
 
 boost::shared_ptr<Orv_ResultQ> Zel_Req::getORVResultQ() const

@@ -16,20 +16,21 @@ Zel_StartupRes::~Zel_StartupRes() = default;
 
 bool Zel_StartupRes::deliverNext()
 {
-    try {
+    // A handler's exception is discarded.
+    ZelResults::discardExceptions([this] {
         if (mCallback && mError) {
             if (mError->isError())
                 mCallback->failed(mError);
             else
                 mCallback->succeeded();
         }
-    } catch (...) {
-        // A handler's exception is discarded.
-    }
+    });
     return false;
 }
 
+// An empty pointer leaves no record: nothing is delivered until a record is
+// set again, rather than a made-up success.
 void Zel_StartupRes::setError(boost::shared_ptr<Zel_Error> error)
 {
-    mError = ZelResults::errorRecord(std::move(error));
+    mError = std::move(error);
 }

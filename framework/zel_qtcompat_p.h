@@ -6,6 +6,7 @@
 #include <QtGlobal>
 #include <QDateTime>
 #include <QElapsedTimer>
+#include <QLocale>
 #include <QRegExp> // Qt 6: from the Core5Compat module
 
 namespace ZelCompat {
@@ -24,6 +25,26 @@ inline uint toTimeT(const QDateTime& dateTime)
     if (seconds < 0 || seconds > qint64(0xFFFFFFFEu))
         return uint(-1);
     return static_cast<uint>(seconds);
+}
+
+// A local date and time as Qt 5's Qt::TextDate writes it: the system
+// locale's short day and month names, the day, hh:mm:ss and the year, for
+// example "Di. März 5 14:07:09 2024" under de_DE. Qt 6's Qt::TextDate always
+// writes English names, so there the same text is made from the system locale.
+inline QString systemTextDate(const QDateTime& local)
+{
+#if QT_VERSION_MAJOR >= 6
+    if (!local.isValid())
+        return QString();
+    const QLocale system = QLocale::system();
+    const QDate date = local.date();
+    return system.dayName(date.dayOfWeek(), QLocale::ShortFormat) + QLatin1Char(' ')
+        + system.monthName(date.month(), QLocale::ShortFormat) + QLatin1Char(' ') + QString::number(date.day())
+        + QLatin1Char(' ') + local.time().toString(QStringLiteral("hh:mm:ss")) + QLatin1Char(' ')
+        + QString::number(date.year());
+#else
+    return local.toString(Qt::TextDate);
+#endif
 }
 
 // The regular expression class of name validation (Qt 6: Core5Compat).

@@ -10,8 +10,10 @@
 //     Zel_Debug::instance()->setEnabled(true);
 //     Zel_Debug::instance()->debug("MyReq", "started", 0);   // "ZEL: MyReq: started"
 //
-// The switch is a plain flag without a lock: a line in progress may still be
-// written just after tracing is switched off.
+// The switch may be set from any thread while others trace: it is an atomic
+// flag of the size of a bool, read and written without ordering (relaxed) and
+// without a lock, so a line in progress may still be written just after
+// tracing is switched off.
 #ifndef ZEL_DEBUG_H
 #define ZEL_DEBUG_H
 
@@ -19,6 +21,8 @@
 
 #include <QString>
 #include <boost/shared_ptr.hpp>
+
+#include <atomic>
 
 class ZEL_EXPORT Zel_Debug
 {
@@ -39,7 +43,7 @@ public:
 private:
     Zel_Debug();
 
-    bool mEnabled;
+    std::atomic<bool> mEnabled;
     static boost::shared_ptr<Zel_Debug> mInstanceSP;
 };
 

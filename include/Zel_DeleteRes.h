@@ -161,6 +161,9 @@ public:
     Zel_DeleteRes& operator=(const Zel_DeleteRes& other);
     virtual ~Zel_DeleteRes();
 
+    // The delivery of Zel_Res; when a question about the current item throws,
+    // the next call goes on with the item after it.
+    bool deliverNext() override;
     // True while the cursor is below the number of items.
     bool haveResults() override;
     // True when there is no current item or its error record reports an error.

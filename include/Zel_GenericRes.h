@@ -31,8 +31,11 @@
 // cursor past it and only then call the handler, with copies of the item's
 // values (the handler's by-value parameters; nothing else is copied). A result
 // whose callback is empty still consumes its items, so deliverNext() comes to
-// return false. An empty error record counts as "no error". No lock is taken:
-// a result is filled by one thread, then delivered.
+// return false. An empty error record counts as "no error". When
+// haveResults() or isCurrentResultError() throws (an error record whose code
+// cannot be read, or a derived class's override), the call ends and the cursor
+// passes over the current item. No lock is taken: a result is filled by one
+// thread, then delivered.
 #ifndef ZEL_GENERICRES_H
 #define ZEL_GENERICRES_H
 
@@ -55,6 +58,10 @@ public:
     }
     Zel_GenericRes(const Zel_GenericRes& other) = default;
     Zel_GenericRes& operator=(const Zel_GenericRes& other) = default;
+
+    // The delivery of Zel_Res; when a question about the current item throws,
+    // the next call goes on with the item after it.
+    bool deliverNext() override { return deliverNextStep(&Zel_GenericRes::stepCursor); }
 
     // True while the cursor is below the number of items.
     bool haveResults() override
@@ -115,6 +122,14 @@ protected:
 
 private:
     Derived& derived() { return static_cast<Derived&>(*this); }
+
+    static bool stepCursor(Zel_Res& result, bool skip)
+    {
+        Derived& self = static_cast<Derived&>(result);
+        if (skip && self.mCursor < self.mItems.size())
+            ++self.mCursor;
+        return self.mCursor < self.mItems.size();
+    }
 };
 
 #endif

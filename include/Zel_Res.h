@@ -8,6 +8,13 @@
 // Exceptions thrown by handlers are caught and discarded; delivery goes on
 // with the next answer on the next call.
 //
+// Delivery always comes to an end. When haveResults() or
+// isCurrentResultError() throws, the call ends: a result that keeps its
+// answers behind a cursor known to delivery (the library's own results) moves
+// past the current answer, so the next call sees the next one; any other
+// result ends there (a final one still calls the finished handler). The
+// exception that cancels a thread (abi::__forced_unwind) is never swallowed.
+//
 // A concrete result implements the five protected-by-contract operations
 // haveResults, isCurrentResultError, doFailed, doSucceeded and doFinished and
 // adds its own setResult. A result is filled by one thread, then pushed, then
@@ -42,6 +49,17 @@ public:
     virtual void doSucceeded() = 0;
     // Tell the callback that the request has delivered its last answer.
     virtual void doFinished() = 0;
+
+protected:
+    // The cursor of a result that keeps its answers in order behind an index:
+    // moves it past the current answer when skip is true, and answers whether
+    // answers remain after it. It must not throw.
+    typedef bool (*AnswerCursor)(Zel_Res& result, bool skip);
+
+    // One deliverNext() step. When haveResults() or isCurrentResultError()
+    // throws, the cursor (if given) passes over the current answer; without
+    // one the result ends.
+    bool deliverNextStep(AnswerCursor cursor);
 };
 
 #endif

@@ -5,8 +5,9 @@
 // becomes nested elements: intermediate levels are shared between keys with a
 // common prefix, the last level is always a new element (a key given twice
 // gives two sibling elements). The root carries "version" ("1.0"),
-// "modifydate" (local time, Qt::TextDate) and "modifydateInt" (seconds since
-// 1970-01-01 00:00 UTC):
+// "modifydate" (local time as Qt 5's Qt::TextDate writes it, with the system
+// locale's short day and month names, in both Qt builds) and "modifydateInt"
+// (seconds since 1970-01-01 00:00 UTC):
 //
 //     Zel_SettingList list;
 //     list.append(Zel_Setting("General.Language", "en"));
@@ -19,14 +20,16 @@
 //     //  <Recent></Recent>
 //     // </Settings>
 //
-// The output is always well-formed: a setting whose key is empty, or yields an
-// element name that is not a valid XML name, is left out (the latter with a
-// trace line), as is the value of a key ending in "."; characters that XML 1.0
-// cannot carry are removed from values; an invalid root name gives an empty
-// text. Element names are limited to what every XML 1.0 reader accepts: the
-// XML letters, digits and marks of the Basic Multilingual Plane, '_', '-' and
-// '.' (not first), never ':'. The process-wide QDom settings are untouched.
-// A plain value: no locks.
+// The output is always well-formed: a setting whose key is empty, has more
+// than 64 levels (dot-separated parts) or yields an element name that is not
+// a valid XML name is left out (the last two with a trace line), as is the
+// value of a key ending in "."; characters that XML 1.0 cannot carry are
+// removed from values; an invalid root name gives an empty text. Element names
+// are limited to those that both Qt 5's and Qt 6's DOM read back unchanged:
+// the XML 1.0 Appendix B letters, digits and marks of the Basic Multilingual
+// Plane less five that Qt 5 refuses (U+00B7, U+0387, U+06DD, U+06DE, U+212E),
+// '_', '-' and '.' (not first), never ':'. The process-wide QDom settings are
+// untouched. A plain value: no locks.
 #ifndef ZEL_SETTINGLIST_H
 #define ZEL_SETTINGLIST_H
 

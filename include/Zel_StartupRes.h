@@ -6,9 +6,9 @@
 // answers false; there is no end notice, the final-result flag is not
 // consulted, and a second call delivers the same outcome again. Before
 // setError, or without a callback, nothing is delivered. setError with an
-// empty pointer stores a "no error" record (a success). An exception thrown by
-// a handler is caught and discarded. Filled by one thread, then delivered; no
-// lock.
+// empty pointer removes the record, so that nothing is delivered (a failure
+// set earlier is not turned into a success). An exception thrown by a handler
+// is caught and discarded. Filled by one thread, then delivered; no lock.
 #ifndef ZEL_STARTUPRES_H
 #define ZEL_STARTUPRES_H
 
@@ -30,7 +30,7 @@ public:
 
     // Delivers the outcome, if set; always answers false.
     bool deliverNext() override;
-    // Replaces the outcome.
+    // Replaces the outcome; an empty pointer leaves none.
     virtual void setError(boost::shared_ptr<Zel_Error> error);
 
 protected:

@@ -20,6 +20,12 @@ namespace {
 
 const char* const kTraceSource = "Zel_SettingList::toXML";
 
+// The most levels a key may have. The DOM writes nested elements recursively,
+// so a key of tens of thousands of levels would overflow the stack.
+const int kMaxLevels = 64;
+
+enum class KeyProblem { None, InvalidName, TooDeep };
+
 // Index key of the first child element with a given name under a parent, so
 // that a lookup costs constant time instead of a scan of the children.
 struct ChildKey
@@ -53,24 +59,29 @@ public:
     }
 
     // Adds the path of one key and returns its leaf element: null when the
-    // key is empty, ends in "." (only the intermediate levels are made) or
-    // yields an invalid element name (nothing is made; *invalid is set).
-    QDomElement addPath(const QString& key, bool* invalid)
+    // key is empty, ends in "." (only the intermediate levels are made), has
+    // more than kMaxLevels levels or yields an invalid element name (in the
+    // last two cases nothing is made and *problem says why).
+    QDomElement addPath(const QString& key, KeyProblem* problem)
     {
-        *invalid = false;
+        *problem = KeyProblem::None;
         if (key.isEmpty())
             return QDomElement();
+        if (key.count(QLatin1Char('.')) >= kMaxLevels) {
+            *problem = KeyProblem::TooDeep;
+            return QDomElement();
+        }
 
         const QStringList levels = key.split(QLatin1Char('.'));
         const int last = levels.size() - 1;
         for (int i = 0; i < last; ++i) {
             if (!ZelXml::isValidName(levels.at(i))) {
-                *invalid = true;
+                *problem = KeyProblem::InvalidName;
                 return QDomElement();
             }
         }
         if (!levels.at(last).isEmpty() && !ZelXml::isValidName(levels.at(last))) {
-            *invalid = true;
+            *problem = KeyProblem::InvalidName;
             return QDomElement();
         }
 
@@ -104,6 +115,18 @@ private:
     std::vector<QDomElement> mElements;
     std::unordered_map<ChildKey, std::size_t, ChildKeyHash> mFirstChild;
 };
+
+// The trace text for a key that is left out. A key that is too deep is shown
+// by its first kMaxLevels levels only.
+QString leftOutText(const QString& key, KeyProblem problem)
+{
+    if (problem == KeyProblem::TooDeep) {
+        return QStringLiteral("key \"%1...\" has %2 levels, more than %3; setting left out")
+            .arg(key.section(QLatin1Char('.'), 0, kMaxLevels - 1), QString::number(key.count(QLatin1Char('.')) + 1),
+                 QString::number(kMaxLevels));
+    }
+    return QStringLiteral("key \"%1\" does not give valid XML element names; setting left out").arg(key);
+}
 
 } // namespace
 
@@ -163,13 +186,11 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
     ElementTree tree(document, root);
     for (const Zel_Setting& setting : *this) {
         const QString key = setting.key();
-        bool invalid = false;
-        QDomElement leaf = tree.addPath(key, &invalid);
-        if (invalid) {
-            if (trace->getEnabled()) {
-                trace->debug(QLatin1String(kTraceSource),
-                    QStringLiteral("key \"%1\" does not give valid XML element names; setting left out").arg(key), 0);
-            }
+        KeyProblem problem = KeyProblem::None;
+        QDomElement leaf = tree.addPath(key, &problem);
+        if (problem != KeyProblem::None) {
+            if (trace->getEnabled())
+                trace->debug(QLatin1String(kTraceSource), leftOutText(key, problem), 0);
             continue;
         }
         if (!leaf.isNull())
@@ -179,7 +200,7 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
     const QDateTime moment = modifyDate.isValid() ? modifyDate : QDateTime::currentDateTime();
     root.setAttribute(QStringLiteral("version"), QStringLiteral("1.0"));
     root.setAttribute(QStringLiteral("modifydate"),
-                      ZelXml::xmlCharsOnly(moment.toLocalTime().toString(Qt::TextDate)));
+                      ZelXml::xmlCharsOnly(ZelCompat::systemTextDate(moment.toLocalTime())));
     root.setAttribute(QStringLiteral("modifydateInt"), QString::number(ZelCompat::toTimeT(moment)));
 
     return document.toString(1);

@@ -13,9 +13,13 @@ struct CharRange
     ushort last;
 };
 
-// XML 1.0 (fourth edition) Appendix B above ASCII. Letters: BaseChar and
-// Ideographic; name extras: CombiningChar, Digit and Extender. Sorted,
-// non-overlapping, adjacent ranges merged.
+// The name characters above ASCII that Qt 5's and Qt 6's DOM both write and
+// read back unchanged, found by trying every BMP character in both. Qt 6's
+// reader takes exactly XML 1.0 (fourth edition) Appendix B; Qt 5's, which
+// goes by Unicode category, takes all of it except U+00B7, U+0387, U+06DD,
+// U+06DE and U+212E, which are therefore left out here. Letters (BaseChar and
+// Ideographic) may start a name; name extras (CombiningChar, Digit and
+// Extender) may only follow. Sorted, non-overlapping, adjacent ranges merged.
 const CharRange kLetters[] = {
     {0x00C0, 0x00D6}, {0x00D8, 0x00F6}, {0x00F8, 0x0131}, {0x0134, 0x013E}, {0x0141, 0x0148},
     {0x014A, 0x017E}, {0x0180, 0x01C3}, {0x01CD, 0x01F0}, {0x01F4, 0x01F5}, {0x01FA, 0x0217},
@@ -55,16 +59,16 @@ const CharRange kLetters[] = {
     {0x1F48, 0x1F4D}, {0x1F50, 0x1F57}, {0x1F59, 0x1F59}, {0x1F5B, 0x1F5B}, {0x1F5D, 0x1F5D},
     {0x1F5F, 0x1F7D}, {0x1F80, 0x1FB4}, {0x1FB6, 0x1FBC}, {0x1FBE, 0x1FBE}, {0x1FC2, 0x1FC4},
     {0x1FC6, 0x1FCC}, {0x1FD0, 0x1FD3}, {0x1FD6, 0x1FDB}, {0x1FE0, 0x1FEC}, {0x1FF2, 0x1FF4},
-    {0x1FF6, 0x1FFC}, {0x2126, 0x2126}, {0x212A, 0x212B}, {0x212E, 0x212E}, {0x2180, 0x2182},
+    {0x1FF6, 0x1FFC}, {0x2126, 0x2126}, {0x212A, 0x212B}, {0x2180, 0x2182},
     {0x3007, 0x3007}, {0x3021, 0x3029}, {0x3041, 0x3094}, {0x30A1, 0x30FA}, {0x3105, 0x312C},
     {0x4E00, 0x9FA5}, {0xAC00, 0xD7A3},
 };
 
 const CharRange kNameExtras[] = {
-    {0x00B7, 0x00B7}, {0x02D0, 0x02D1}, {0x0300, 0x0345}, {0x0360, 0x0361}, {0x0387, 0x0387},
+    {0x02D0, 0x02D1}, {0x0300, 0x0345}, {0x0360, 0x0361},
     {0x0483, 0x0486}, {0x0591, 0x05A1}, {0x05A3, 0x05B9}, {0x05BB, 0x05BD}, {0x05BF, 0x05BF},
     {0x05C1, 0x05C2}, {0x05C4, 0x05C4}, {0x0640, 0x0640}, {0x064B, 0x0652}, {0x0660, 0x0669},
-    {0x0670, 0x0670}, {0x06D6, 0x06E4}, {0x06E7, 0x06E8}, {0x06EA, 0x06ED}, {0x06F0, 0x06F9},
+    {0x0670, 0x0670}, {0x06D6, 0x06DC}, {0x06DF, 0x06E4}, {0x06E7, 0x06E8}, {0x06EA, 0x06ED}, {0x06F0, 0x06F9},
     {0x0901, 0x0903}, {0x093C, 0x093C}, {0x093E, 0x094D}, {0x0951, 0x0954}, {0x0962, 0x0963},
     {0x0966, 0x096F}, {0x0981, 0x0983}, {0x09BC, 0x09BC}, {0x09BE, 0x09C4}, {0x09C7, 0x09C8},
     {0x09CB, 0x09CD}, {0x09D7, 0x09D7}, {0x09E2, 0x09E3}, {0x09E6, 0x09EF}, {0x0A02, 0x0A02},
@@ -99,42 +103,12 @@ bool isAsciiLetter(ushort u)
     return (u >= 'A' && u <= 'Z') || (u >= 'a' && u <= 'z');
 }
 
-// Qt 5's DOM reader classifies name characters by Unicode category; the
-// tables above are what Qt 6's reader (and the standard) use. Both must agree.
-bool isLetterCategory(QChar::Category category)
-{
-    switch (category) {
-    case QChar::Letter_Uppercase:
-    case QChar::Letter_Lowercase:
-    case QChar::Letter_Titlecase:
-    case QChar::Letter_Other:
-    case QChar::Number_Letter:
-        return true;
-    default:
-        return false;
-    }
-}
-
-bool isFollowingCategory(QChar::Category category)
-{
-    switch (category) {
-    case QChar::Letter_Modifier:
-    case QChar::Number_DecimalDigit:
-    case QChar::Mark_NonSpacing:
-    case QChar::Mark_SpacingCombining:
-    case QChar::Mark_Enclosing:
-        return true;
-    default:
-        return isLetterCategory(category);
-    }
-}
-
 bool isNameStartChar(QChar c)
 {
     const ushort u = c.unicode();
     if (u < 0x80)
         return isAsciiLetter(u) || u == '_';
-    return inRanges(kLetters, u) && isLetterCategory(c.category());
+    return inRanges(kLetters, u);
 }
 
 bool isNameChar(QChar c)
@@ -142,7 +116,7 @@ bool isNameChar(QChar c)
     const ushort u = c.unicode();
     if (u < 0x80)
         return isAsciiLetter(u) || (u >= '0' && u <= '9') || u == '_' || u == '-' || u == '.';
-    return (inRanges(kLetters, u) || inRanges(kNameExtras, u)) && isFollowingCategory(c.category());
+    return inRanges(kLetters, u) || inRanges(kNameExtras, u);
 }
 
 // Whether the UTF-16 unit at i starts an XML 1.0 Char; sets length to 1 or 2.

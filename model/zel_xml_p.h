@@ -8,12 +8,13 @@
 
 namespace ZelXml {
 
-// True when name is a valid element or attribute name for every XML 1.0
-// reader, Qt's included: the XML 1.0 (fourth edition, Appendix B) letters and
-// name characters, ASCII '_', '-', '.', and only where the Unicode category
-// agrees (letters start a name; marks, digits and modifier letters may follow).
-// ':' is refused, since an undeclared prefix fails namespace-aware readers, as
-// are characters outside the Basic Multilingual Plane.
+// True when name is an element or attribute name that both Qt 5's and Qt 6's
+// DOM write and read back as the same name: the XML 1.0 (fourth edition,
+// Appendix B) letters and name characters, less five that Qt 5's reader
+// refuses, and ASCII '_', '-', '.' (letters and '_' start a name). ':' is
+// refused, since an undeclared prefix fails namespace-aware readers (Qt 6
+// reads "a:" as an error), as are characters outside the Basic Multilingual
+// Plane.
 bool isValidName(const QString& name);
 
 // The text without the characters XML 1.0 cannot carry: control characters

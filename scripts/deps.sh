@@ -4,21 +4,34 @@
 set -euo pipefail
 
 qt_major="${1:-5}"
-packages=(g++ cmake make pkg-config libboost-dev libgtest-dev libgmock-dev libbenchmark-dev valgrind)
+packages=(g++ cmake make pkg-config libboost-dev libgtest-dev libgmock-dev libbenchmark-dev valgrind locales)
 if [ "$qt_major" = 6 ]; then
   packages+=(qt6-base-dev qt6-5compat-dev)
 else
   packages+=(qtbase5-dev)
 fi
 
+sudo=""
+[ "$(id -u)" -eq 0 ] || sudo="sudo"
+
 missing=()
 for p in "${packages[@]}"; do
   dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q "install ok installed" || missing+=("$p")
 done
-[ ${#missing[@]} -eq 0 ] && exit 0
+if [ ${#missing[@]} -gt 0 ]; then
+  echo "Installing missing packages: ${missing[*]}"
+  $sudo apt-get update -qq
+  DEBIAN_FRONTEND=noninteractive $sudo apt-get install -y -qq --no-install-recommends "${missing[@]}" >/dev/null
+fi
 
-echo "Installing missing packages: ${missing[*]}"
-sudo=""
-[ "$(id -u)" -eq 0 ] || sudo="sudo"
-$sudo apt-get update -qq
-DEBIAN_FRONTEND=noninteractive $sudo apt-get install -y -qq --no-install-recommends "${missing[@]}" >/dev/null
+# The locale tests run under de_DE.UTF-8: generate it when it is missing.
+if ! locale -a 2>/dev/null | grep -qix 'de_DE\.utf-\?8'; then
+  echo "Generating the locale de_DE.UTF-8"
+  if [ -f /etc/locale.gen ]; then
+    grep -q '^de_DE\.UTF-8 UTF-8' /etc/locale.gen \
+      || echo 'de_DE.UTF-8 UTF-8' | $sudo tee -a /etc/locale.gen >/dev/null
+    $sudo locale-gen >/dev/null
+  else
+    $sudo locale-gen de_DE.UTF-8 >/dev/null
+  fi
+fi

@@ -36,6 +36,8 @@
 #include <boost/make_shared.hpp>
 #include <boost/shared_ptr.hpp>
 
+#include <pthread.h>
+
 #include <algorithm>
 #include <cstdint>
 #include <map>
@@ -93,6 +95,9 @@ public:
     // Makes the handler call with this 1-based number throw: a std exception
     // or, with foreign, an int.
     void throwAt(std::size_t callNumber, bool foreign = false) { (foreign ? mThrowForeign : mThrowStd).insert(callNumber); }
+    // Makes the handler call with this 1-based number end its thread
+    // (pthread_exit), after recording the call.
+    void exitThreadAt(std::size_t callNumber) { mExitThread.insert(callNumber); }
 
     template <class... Args>
     void call(const char* handler, const Args&... args)
@@ -109,6 +114,8 @@ public:
             throw std::runtime_error("handler failure");
         if (mThrowForeign.count(calls.size()))
             throw 42;
+        if (mExitThread.count(calls.size()))
+            pthread_exit(nullptr);
     }
 
     Calls calls;
@@ -117,6 +124,7 @@ private:
     std::map<const void*, std::string> mNames;
     std::set<std::size_t> mThrowStd;
     std::set<std::size_t> mThrowForeign;
+    std::set<std::size_t> mExitThread;
 };
 
 // Calls deliverNext() until it answers false (at most 20 times); the answers, e.g. "TTF".
@@ -131,6 +139,29 @@ std::string deliverAll(Res& result)
             break;
     }
     return answers;
+}
+
+// One deliverNext() call on a thread of its own: "T" or "F" for its answer,
+// "X" when a handler ended the thread inside the call.
+template <class Res>
+std::string deliverOnOwnThread(Res& result)
+{
+    struct Run {
+        Res* result;
+        std::string answer = "X";
+    } run{&result};
+    pthread_t thread;
+    if (pthread_create(&thread, nullptr,
+                       [](void* context) -> void* {
+                           Run* r = static_cast<Run*>(context);
+                           r->answer = r->result->deliverNext() ? "T" : "F";
+                           return nullptr;
+                       },
+                       &run)
+        != 0)
+        return "no thread";
+    pthread_join(thread, nullptr);
+    return run.answer;
 }
 
 // A success record (code -1).

@@ -144,12 +144,12 @@ TEST(Zel_StartupResTest, DeliversTheOneOutcomeOnEveryCallWithoutEndNotice)
         EXPECT_EQ(log.calls, (Calls{"succeeded()", "succeeded()", "failed(e)"}));
     }
 
-    // A throwing handler, an empty record and a missing callback.
+    // A throwing handler and a missing callback.
     CallLog log;
     log.throwAt(1);
     log.throwAt(2, true);
     Zel_StartupRes result(boost::make_shared<StartupCB>(log), true);
-    result.setError(ErrorSP());
+    result.setError(ok());
     EXPECT_FALSE(result.deliverNext());
     EXPECT_FALSE(result.deliverNext());
     EXPECT_EQ(log.calls, (Calls{"succeeded()", "succeeded()"}));
@@ -157,6 +157,32 @@ TEST(Zel_StartupResTest, DeliversTheOneOutcomeOnEveryCallWithoutEndNotice)
     Zel_StartupRes orphan(boost::shared_ptr<Zel_StartupCB>(), true);
     orphan.setError(boost::make_shared<Zel_Error>(1, QString()));
     EXPECT_FALSE(orphan.deliverNext());
+}
+
+TEST(Zel_StartupResTest, EmptyRecordLeavesNoOutcomeInsteadOfASuccess)
+{
+    // setError replaces the record; an empty pointer leaves none, and without a
+    // record nothing is delivered: a failure set earlier never turns into a
+    // success, and no success is made up.
+    CallLog log;
+    Zel_StartupRes result(boost::make_shared<StartupCB>(log), true);
+    result.setError(log.error("e"));
+    result.setError(ErrorSP());
+    EXPECT_FALSE(result.deliverNext());
+    EXPECT_TRUE(log.calls.empty()) << log.calls.front();
+
+    Zel_StartupRes fresh(boost::make_shared<StartupCB>(log), false);
+    fresh.setError(ErrorSP());
+    EXPECT_FALSE(fresh.deliverNext());
+    EXPECT_TRUE(log.calls.empty()) << log.calls.front();
+
+    // A record set afterwards is delivered as usual, also by a copy.
+    fresh.setError(log.error("later"));
+    const Zel_StartupRes copy(fresh);
+    fresh.setError(ErrorSP());
+    EXPECT_FALSE(fresh.deliverNext());
+    EXPECT_FALSE(Zel_StartupRes(copy).deliverNext());
+    EXPECT_EQ(log.calls, (Calls{"failed(later)"}));
 }
 
 TEST(Zel_AddDependencyResTest, DeliversNodeAndDependencyListThenFinishesInTheSameCall)

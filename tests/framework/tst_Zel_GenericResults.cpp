@@ -5,10 +5,13 @@
 
 #include "Orv_Engine.h"
 #include "Zel_AssociationsRes.h"
+#include "Zel_CheckinRes.h"
+#include "Zel_CheckinUpdateRes.h"
 #include "Zel_ChildrenRes.h"
 #include "Zel_CreateFolderUniqueRes.h"
 #include "Zel_CreateNodeUniqueRes.h"
 #include "Zel_CreateReservationRes.h"
+#include "Zel_DeleteRes.h"
 #include "Zel_DeleteNodeRes.h"
 #include "Zel_Directory.h"
 #include "Zel_GetApplicationSettingsRes.h"
@@ -30,6 +33,7 @@
 #include "Zel_SetApplicationSettingsRes.h"
 #include "Zel_SetUserSettingsRes.h"
 #include "Zel_SettingsRes.h"
+#include "Zel_StartupRes.h"
 
 #include <boost/weak_ptr.hpp>
 #include <gtest/gtest.h>
@@ -299,6 +303,156 @@ TEST(Zel_ResTest, EmptyCallbackConsumesItemsAndNullErrorMeansNoError)
     EXPECT_EQ(deliverAll(children), "F");
     EXPECT_EQ(deliverAll(reservation), "F");
     EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "finished()", "succeeded(a,b)", "succeeded()"}));
+}
+
+namespace {
+
+// An error record whose code cannot be read: isError() throws.
+struct UnreadableError : Zel_Error {
+    const int getCode() const override { throw std::runtime_error("unreadable code"); }
+};
+
+// A node result whose own haveResults() or isCurrentResultError() throws (an
+// int) while the cursor stands at the given item.
+struct ThrowingQuestionsRes : Zel_GetNodeRes {
+    ThrowingQuestionsRes(boost::shared_ptr<Zel_ResultCB> callback, quint64 haveResultsThrowsAt,
+                         quint64 verdictThrowsAt)
+        : Zel_GetNodeRes(callback, true), mHaveResultsThrowsAt(haveResultsThrowsAt), mVerdictThrowsAt(verdictThrowsAt)
+    {
+    }
+    bool haveResults() override
+    {
+        if (mCursor == mHaveResultsThrowsAt)
+            throw 1;
+        return Zel_GetNodeRes::haveResults();
+    }
+    bool isCurrentResultError() override
+    {
+        if (mCursor == mVerdictThrowsAt)
+            throw 2;
+        return Zel_GetNodeRes::isCurrentResultError();
+    }
+    quint64 mHaveResultsThrowsAt, mVerdictThrowsAt;
+};
+
+// A result derived straight from Zel_Res that keeps items the base cannot see
+// and cannot tell whether its current item is an error.
+struct OpaqueRes : Zel_Res {
+    OpaqueRes(CallLog& log, bool finalResult) : Zel_Res(boost::shared_ptr<Orv_ResultsCB>(), finalResult), mLog(log) {}
+    bool haveResults() override { return mLeft > 0; }
+    bool isCurrentResultError() override { throw std::logic_error("no verdict"); }
+    void doFailed() override { --mLeft, mLog.record("doFailed"); }
+    void doSucceeded() override { --mLeft, mLog.record("doSucceeded"); }
+    void doFinished() override { mLog.record("doFinished"); }
+    CallLog& mLog;
+    int mLeft = 3;
+};
+
+} // namespace
+
+TEST(Zel_ResTest, ThrowingQuestionsEndTheCallAndTheNextCallMovesOnToTheNextItem)
+{
+    // An item whose record cannot be read is passed over: the call that meets
+    // it ends, the next one delivers the following item, and the end notice
+    // still comes.
+    {
+        CallLog log;
+        Zel_GetNodeRes result(boost::make_shared<NodeCB<Zel_ResultCB>>(log), true);
+        result.setResult(log.node("n1"), ok());
+        result.setResult(log.node("n2"), boost::make_shared<UnreadableError>());
+        result.setResult(log.node("n3"), ok());
+        result.setResult(log.node("n4"), boost::make_shared<UnreadableError>());
+        EXPECT_EQ(deliverAll(result), "TTTF");
+        EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "succeeded(n3)", "finished()"}));
+    }
+    // The same for a derived result whose own questions throw: haveResults()
+    // before the first item and after the second, isCurrentResultError() at the
+    // third.
+    {
+        CallLog log;
+        ThrowingQuestionsRes result(boost::make_shared<NodeCB<Zel_ResultCB>>(log), 0, 2);
+        for (const char* name : {"n1", "n2", "n3", "n4"})
+            result.setResult(log.node(name), ok());
+        EXPECT_EQ(deliverAll(result), "TTTF");
+        EXPECT_EQ(log.calls, (Calls{"succeeded(n2)", "succeeded(n4)", "finished()"}));
+
+        CallLog afterLog;
+        ThrowingQuestionsRes after(boost::make_shared<NodeCB<Zel_ResultCB>>(afterLog), 1, 99);
+        for (const char* name : {"n1", "n2", "n3"})
+            after.setResult(afterLog.node(name), ok());
+        EXPECT_EQ(deliverAll(after), "TTF");
+        EXPECT_EQ(afterLog.calls, (Calls{"succeeded(n1)", "succeeded(n3)", "finished()"}));
+    }
+    // Deletion outcomes: the item picks its handler, but an unreadable record
+    // still ends the call that meets it.
+    {
+        CallLog log;
+        Zel_DeleteRes result(boost::make_shared<DeleteCB>(log), true);
+        result.setRemoteAssetDeleteSuccessTotalResult(3, ok());
+        result.setErrorResult(boost::make_shared<UnreadableError>());
+        result.setRemoteMetadataDeleteSuccessTotalResult(4, ok());
+        EXPECT_EQ(deliverAll(result), "TTF");
+        EXPECT_EQ(log.calls, (Calls{"remoteAssetDeleteSuccessTotalResult(3)",
+                                    "remoteMetadataDeleteSuccessTotalResult(4)", "finished()"}));
+    }
+    // A result whose items the base cannot pass over ends at the first
+    // unanswerable question; a final one still reports the end.
+    for (bool finalResult : {true, false}) {
+        CallLog log;
+        OpaqueRes result(log, finalResult);
+        EXPECT_EQ(deliverAll(result), "F");
+        EXPECT_EQ(log.calls, finalResult ? Calls{"doFinished"} : Calls{});
+    }
+}
+
+TEST(Zel_ResTest, ThreadExitInsideAHandlerEndsOnlyThatThreadAndDeliveryGoesOn)
+{
+    // pthread_exit unwinds with an exception that must not be swallowed; a
+    // result that caught it would abort the process.
+    {
+        CallLog log;
+        log.exitThreadAt(1);
+        log.exitThreadAt(4);
+        Zel_GetNodeRes result(boost::make_shared<NodeCB<Zel_ResultCB>>(log), true);
+        result.setResult(log.node("n1"), ok());
+        result.setResult(log.node("n2"), log.error("e2"));
+        result.setResult(log.node("n3"), ok());
+        EXPECT_EQ(deliverOnOwnThread(result), "X");
+        EXPECT_EQ(deliverOnOwnThread(result), "T");
+        EXPECT_EQ(deliverOnOwnThread(result), "X");
+        EXPECT_EQ(log.calls, (Calls{"succeeded(n1)", "failed(e2)", "succeeded(n3)", "finished()"}));
+    }
+    {
+        CallLog log;
+        log.exitThreadAt(2);
+        log.exitThreadAt(4);
+        Zel_CheckinRes result(boost::make_shared<CheckinCB>(log), true);
+        result.addItem(log.desc("d1"), log.node("n1"), log.text("t1"), ok());
+        result.addItem(log.desc("d2"), log.node("n2"), log.text("t2"), log.error("e2"));
+        result.addItem(log.desc("d3"), log.node("n3"), log.text("t3"), ok());
+        EXPECT_EQ(deliverOnOwnThread(result), "T");
+        EXPECT_EQ(deliverOnOwnThread(result), "X");
+        EXPECT_EQ(deliverOnOwnThread(result), "X");
+        EXPECT_EQ(log.calls, (Calls{"succeeded(d1,n1,t1)", "failed(d2,e2)", "succeeded(d3,n3,t3)", "finished()"}));
+    }
+    {
+        CallLog log;
+        log.exitThreadAt(1);
+        Zel_CheckinUpdateRes result(boost::make_shared<VoidCB<Zel_CheckinUpdateCB>>(log), true);
+        result.addItem(ok());
+        EXPECT_EQ(deliverOnOwnThread(result), "X");
+        EXPECT_EQ(deliverOnOwnThread(result), "F");
+        EXPECT_EQ(log.calls, (Calls{"succeeded()", "finished()"}));
+    }
+    {
+        CallLog log;
+        log.exitThreadAt(1);
+        Zel_StartupRes result(boost::make_shared<StartupCB>(log), true);
+        result.setError(log.error("e"));
+        EXPECT_EQ(deliverOnOwnThread(result), "X");
+        EXPECT_EQ(deliverOnOwnThread(result), "F");
+        EXPECT_EQ(log.calls, (Calls{"failed(e)", "failed(e)"}));
+    }
 }
 
 TEST(Zel_ResTest, CopySharesCallbackAndPayloadKeepsItsOwnCursorAndReleasesTheCallbackLast)

@@ -130,6 +130,17 @@ TEST(Zel_ReqTest, LatinOneNameComesBackFromGetNameAndReachesTheTraceUnchanged)
     EXPECT_EQ(lines[0], "ZEL: Z\xE9l: processing request" + idText(request));
 }
 
+TEST(Zel_ReqTest, NameWithAnEmbeddedNulComesBackWholeFromGetName)
+{
+    // The engine's name is a std::string with its own length; a NUL inside it
+    // is a character of the name, not its end.
+    const QString name = QStringLiteral("Zel_Get") + QChar(0) + QStringLiteral("NodeReq") + QChar(0);
+    ScriptedReq request(name, [](boost::shared_ptr<Orv_Result>&) { return true; });
+    EXPECT_EQ(request.name(), std::string("Zel_Get\0NodeReq\0", 16));
+    EXPECT_EQ(request.getName(), name);
+    EXPECT_EQ(request.getName().size(), 16);
+}
+
 TEST(Zel_ReqTest, WorkWithoutResultPushesNothingPassesItsAnswerAndRunsAgainOnANewQueue)
 {
     TraceCapture capture(false);
