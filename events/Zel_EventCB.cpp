@@ -4,6 +4,8 @@
 #include "Zel_Event.h"
 #include "Zel_EventListener.h"
 
+#include <cxxabi.h>
+
 Zel_EventCB::Zel_EventCB()
     : Orv_ResultsCB(Orv_RequestID(Orv_RequestID::Callback))
     , mMutex("Zel_EventCB Mutex", false)
@@ -106,6 +108,9 @@ void Zel_EventCB::processEvent(const Zel_EventListenerSPList& listeners, const Q
         // The snapshot keeps the listener alive through its call.
         try {
             entry->handleEvent(event);
+        } catch (abi::__forced_unwind&) {
+            // Thread cancellation or pthread_exit: the thread must unwind.
+            throw;
         } catch (...) {
             // One listener's failure must not keep the event from the others.
         }

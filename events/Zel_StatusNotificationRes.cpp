@@ -2,6 +2,8 @@
 
 #include "Zel_StatusNotificationCB.h"
 
+#include <cxxabi.h>
+
 Zel_StatusNotificationRes::Zel_StatusNotificationRes(boost::shared_ptr<Zel_StatusNotificationCB> callback,
                                                      NotificationType type)
     : Orv_Result(callback, false)
@@ -25,6 +27,9 @@ bool Zel_StatusNotificationRes::deliverNext()
             mCallback->connected();
         else if (isDisconnectedResult())
             mCallback->disconnected();
+    } catch (abi::__forced_unwind&) {
+        // Thread cancellation or pthread_exit: the thread must unwind.
+        throw;
     } catch (...) {
         // The application's handler failed; the notification counts as delivered.
     }

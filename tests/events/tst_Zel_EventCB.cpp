@@ -127,6 +127,31 @@ TEST_F(Zel_EventCBTest, AThrowingListenerDoesNotStopDeliveryToTheOthers)
     EXPECT_EQ(names(), QStringList({"a1", "a2", "all"}));
 }
 
+TEST_F(Zel_EventCBTest, AThreadEndedInsideAListenerUnwindsThroughDeliveryAndLeavesTheHubUsable)
+{
+    // pthread_exit and cancellation unwind the thread with an exception that
+    // must not be swallowed (glibc aborts the process if it is).
+    const auto made = registered({{"ender", "A"}, {"after", "A"}, {"all", ""}});
+    void* const delivered = reinterpret_cast<void*>(1);
+    void* const exited = reinterpret_cast<void*>(42);
+    made[0]->onEvent = [exited](RecordingListener&) { pthread_exit(exited); };
+    EXPECT_EQ(runOnPosixThread([&] { deliver(hub, addedEvent("A", "c")); return delivered; }), exited);
+    EXPECT_EQ(names(), QStringList());
+
+    made[0]->onEvent = [](RecordingListener&) {
+        pthread_cancel(pthread_self());
+        pthread_testcancel();
+    };
+    EXPECT_EQ(runOnPosixThread([&] { deliver(hub, addedEvent("A", "c")); return delivered; }), PTHREAD_CANCELED);
+    EXPECT_EQ(names(), QStringList());
+
+    // The unwinding released the hub's lock: this thread delivers and registers.
+    made[0]->onEvent = nullptr;
+    session->UnregisterListener(made[1]);
+    deliver(hub, addedEvent("A", "d"));
+    EXPECT_EQ(names(), QStringList({"ender", "all"}));
+}
+
 TEST_F(Zel_EventCBTest, ListenersMayChangeRegistrationsDuringDeliveryWithoutDisturbingIt)
 {
     const auto late = listener("late", "A");
