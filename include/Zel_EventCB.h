@@ -67,6 +67,8 @@ protected:
 private:
     friend class Zel_Session;
     friend class Zel_EventRes;
+    // Takes itself out of the hub under the hub's lock (folder facades).
+    friend class Zel_EventListenerFolderImpl;
 
     typedef QMap<QString, Zel_EventListenerSPList> Table;
 
