@@ -4,7 +4,7 @@
 #include "Zel_Event.h"
 #include "Zel_EventListener.h"
 
-#include <cxxabi.h>
+#include <exception>
 
 Zel_EventCB::Zel_EventCB()
     : Orv_ResultsCB(Orv_RequestID(Orv_RequestID::Callback))
@@ -108,11 +108,13 @@ void Zel_EventCB::processEvent(const Zel_EventListenerSPList& listeners, const Q
         // The snapshot keeps the listener alive through its call.
         try {
             entry->handleEvent(event);
-        } catch (abi::__forced_unwind&) {
-            // Thread cancellation or pthread_exit: the thread must unwind.
-            throw;
         } catch (...) {
             // One listener's failure must not keep the event from the others.
+            // The unwinding of a thread that is cancelled or calls pthread_exit
+            // (abi::__forced_unwind) must go on; it carries no C++ object, so
+            // current_exception() is empty for it.
+            if (!std::current_exception())
+                throw;
         }
     }
 }

@@ -3,7 +3,7 @@
 #include "Zel_Event.h"
 #include "Zel_EventCB.h"
 
-#include <cxxabi.h>
+#include <exception>
 
 Zel_EventRes::Zel_EventRes(boost::shared_ptr<Zel_EventCB> hub, boost::shared_ptr<Zel_Event> event)
     : Orv_Result(hub, false)
@@ -24,11 +24,13 @@ bool Zel_EventRes::deliverNext()
         return false;
     try {
         mHub->handleEvent(mEvent);
-    } catch (abi::__forced_unwind&) {
-        // Thread cancellation or pthread_exit: the thread must unwind.
-        throw;
     } catch (...) {
         // Delivery problems stay here; the engine goes on with the next result.
+        // The unwinding of a thread that is cancelled or calls pthread_exit
+        // (abi::__forced_unwind) must go on; it carries no C++ object, so
+        // current_exception() is empty for it.
+        if (!std::current_exception())
+            throw;
     }
     return false;
 }

@@ -2,7 +2,7 @@
 
 #include "Zel_StatusNotificationCB.h"
 
-#include <cxxabi.h>
+#include <exception>
 
 Zel_StatusNotificationRes::Zel_StatusNotificationRes(boost::shared_ptr<Zel_StatusNotificationCB> callback,
                                                      NotificationType type)
@@ -27,11 +27,13 @@ bool Zel_StatusNotificationRes::deliverNext()
             mCallback->connected();
         else if (isDisconnectedResult())
             mCallback->disconnected();
-    } catch (abi::__forced_unwind&) {
-        // Thread cancellation or pthread_exit: the thread must unwind.
-        throw;
     } catch (...) {
         // The application's handler failed; the notification counts as delivered.
+        // The unwinding of a thread that is cancelled or calls pthread_exit
+        // (abi::__forced_unwind) must go on; it carries no C++ object, so
+        // current_exception() is empty for it.
+        if (!std::current_exception())
+            throw;
     }
     return false;
 }
