@@ -4,6 +4,8 @@
 #include "Zel_Event.h"
 #include "Zel_EventListener.h"
 
+#include <exception>
+
 Zel_EventCB::Zel_EventCB()
     : Orv_ResultsCB(Orv_RequestID(Orv_RequestID::Callback))
     , mMutex("Zel_EventCB Mutex", false)
@@ -108,6 +110,11 @@ void Zel_EventCB::processEvent(const Zel_EventListenerSPList& listeners, const Q
             entry->handleEvent(event);
         } catch (...) {
             // One listener's failure must not keep the event from the others.
+            // The unwinding of a thread that is cancelled or calls pthread_exit
+            // (abi::__forced_unwind) must go on; it carries no C++ object, so
+            // current_exception() is empty for it.
+            if (!std::current_exception())
+                throw;
         }
     }
 }

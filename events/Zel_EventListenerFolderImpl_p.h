@@ -1,7 +1,14 @@
 // Internal: the folder listener that a Zel_IEventListenerFolder owns and
 // registers. It forwards the three notifications to its facade through a
-// plain pointer, which the facade clears in its destructor; afterwards the
-// notifications do nothing. Never installed.
+// plain pointer. It remembers the hub it is filed in, so that the facade can
+// take it out of that hub even when the session it was registered through is
+// gone (a dead copy of a session sharing the hub, or the last session in the
+// middle of its destruction). Never installed.
+//
+// Threads: the facade pointer is read during delivery, with the hub's lock
+// held, and cleared with that same lock held; the remembered hub is touched
+// only by the facade's own operations. A listener is filed in one hub at a
+// time: the facade detaches it before it attaches it again.
 #ifndef ZEL_EVENTLISTENERFOLDERIMPL_P_H
 #define ZEL_EVENTLISTENERFOLDERIMPL_P_H
 
@@ -9,8 +16,11 @@
 
 #include <QString>
 #include <boost/shared_ptr.hpp>
+#include <boost/weak_ptr.hpp>
 
+class Zel_EventCB;
 class Zel_IEventListenerFolder;
+class Zel_Session;
 
 class Zel_EventListenerFolderImpl : public Zel_EventListenerFolder
 {
@@ -22,14 +32,24 @@ public:
     virtual void childRemoved(boost::shared_ptr<QString> parentMoniker, boost::shared_ptr<QString> childMoniker) override;
     virtual void childUpdated(boost::shared_ptr<QString> parentMoniker, boost::shared_ptr<QString> childMoniker) override;
 
-    // Called by the facade's destructor: no call reaches the facade afterwards.
-    void detachFacade() { mFacade = nullptr; }
+    // Registers this listener with the session and remembers the session's
+    // hub. Call detach first when it may be filed elsewhere.
+    void attach(Zel_Session& session);
+    // Takes this listener out of the remembered hub, if that hub still lives;
+    // with forgetFacade, also clears the facade pointer so that no call ever
+    // reaches the facade again. Both happen under the hub's lock: when this
+    // returns, no other thread is inside a notification of the facade and none
+    // can enter one. The lock is recursive, so a notification may detach its
+    // own listener on the delivering thread. Without a live hub nothing can
+    // deliver to this listener, and nothing is done.
+    void detach(bool forgetFacade);
 
 private:
     Zel_EventListenerFolderImpl(const Zel_EventListenerFolderImpl&) = delete;
     Zel_EventListenerFolderImpl& operator=(const Zel_EventListenerFolderImpl&) = delete;
 
     Zel_IEventListenerFolder* mFacade;
+    boost::weak_ptr<Zel_EventCB> mHub;
 };
 
 #endif

@@ -3,6 +3,8 @@
 #include "Zel_Event.h"
 #include "Zel_EventCB.h"
 
+#include <exception>
+
 Zel_EventRes::Zel_EventRes(boost::shared_ptr<Zel_EventCB> hub, boost::shared_ptr<Zel_Event> event)
     : Orv_Result(hub, false)
     , mHub(std::move(hub))
@@ -24,6 +26,11 @@ bool Zel_EventRes::deliverNext()
         mHub->handleEvent(mEvent);
     } catch (...) {
         // Delivery problems stay here; the engine goes on with the next result.
+        // The unwinding of a thread that is cancelled or calls pthread_exit
+        // (abi::__forced_unwind) must go on; it carries no C++ object, so
+        // current_exception() is empty for it.
+        if (!std::current_exception())
+            throw;
     }
     return false;
 }

@@ -1,5 +1,7 @@
 #include "Zel_IEventListenerFolder.h"
 
+#include "Threads_MutexTenure.h"
+#include "Zel_EventCB.h"
 #include "Zel_EventListenerFolderImpl_p.h"
 #include "Zel_Session.h"
 
@@ -33,6 +35,28 @@ void Zel_EventListenerFolderImpl::childUpdated(boost::shared_ptr<QString> parent
         mFacade->childUpdated(std::move(parentMoniker), std::move(childMoniker));
 }
 
+void Zel_EventListenerFolderImpl::attach(Zel_Session& session)
+{
+    session.RegisterListener(shared_from_this());
+    mHub = session.getEventCBSP();
+}
+
+void Zel_EventListenerFolderImpl::detach(bool forgetFacade)
+{
+    const boost::shared_ptr<Zel_EventCB> hub = mHub.lock();
+    mHub.reset();
+    // Never filed, or the hub is gone: no delivery can reach this listener
+    // (a delivery holds its hub), so there is nothing to take out or cut off.
+    if (!hub)
+        return;
+    // Delivery holds this lock through every listener call, so taking it waits
+    // for a delivery in progress on another thread to end.
+    Threads::MutexTenure tenure(hub->mMutex, nullptr);
+    hub->Unregister(shared_from_this());
+    if (forgetFacade)
+        mFacade = nullptr;
+}
+
 Zel_IEventListenerFolder::Zel_IEventListenerFolder(boost::shared_ptr<QString> moniker, unsigned long enabledMask,
                                                    boost::shared_ptr<Zel_Session> session)
     : mImpl(new Zel_EventListenerFolderImpl(std::move(moniker), this))
@@ -43,11 +67,11 @@ Zel_IEventListenerFolder::Zel_IEventListenerFolder(boost::shared_ptr<QString> mo
 
 Zel_IEventListenerFolder::~Zel_IEventListenerFolder()
 {
-    unregisterEventListener();
-    // A hub may still hold the internal listener (a session copy sharing the
-    // hub, say); from now on its notifications go nowhere.
+    // Unregisters, as unregisterEventListener does, and cuts the internal
+    // listener off this facade in the same step.
     if (mImpl)
-        mImpl->detachFacade();
+        mImpl->detach(true);
+    mSession.reset();
 }
 
 void Zel_IEventListenerFolder::childAdded(boost::shared_ptr<QString>, boost::shared_ptr<QString>)
@@ -64,17 +88,20 @@ void Zel_IEventListenerFolder::childUpdated(boost::shared_ptr<QString>, boost::s
 
 void Zel_IEventListenerFolder::registerEventListener(boost::shared_ptr<Zel_Session> session)
 {
-    if (!mSession.expired())
-        unregisterEventListener();
+    // Leaves the hub it is filed in first, even when the session it came
+    // through is gone while the hub lives on.
+    unregisterEventListener();
     mSession = session;
     if (session && mImpl)
-        session->RegisterListener(mImpl);
+        mImpl->attach(*session);
 }
 
 void Zel_IEventListenerFolder::unregisterEventListener()
 {
-    if (const boost::shared_ptr<Zel_Session> session = mSession.lock())
-        session->UnregisterListener(mImpl);
+    // The hub it was filed in, not the session, which may have died while a
+    // copy of it (or a pending event result) keeps the hub alive.
+    if (mImpl)
+        mImpl->detach(false);
     mSession.reset();
 }
 

@@ -2,6 +2,8 @@
 
 #include "Zel_StatusNotificationCB.h"
 
+#include <exception>
+
 Zel_StatusNotificationRes::Zel_StatusNotificationRes(boost::shared_ptr<Zel_StatusNotificationCB> callback,
                                                      NotificationType type)
     : Orv_Result(callback, false)
@@ -27,6 +29,11 @@ bool Zel_StatusNotificationRes::deliverNext()
             mCallback->disconnected();
     } catch (...) {
         // The application's handler failed; the notification counts as delivered.
+        // The unwinding of a thread that is cancelled or calls pthread_exit
+        // (abi::__forced_unwind) must go on; it carries no C++ object, so
+        // current_exception() is empty for it.
+        if (!std::current_exception())
+            throw;
     }
     return false;
 }

@@ -21,7 +21,9 @@
 // lists, so such changes never disturb the delivery in progress: a listener
 // registered meanwhile waits for the next event, and one unregistered
 // meanwhile is skipped. Each listener call is isolated: an exception from one
-// listener is discarded and the others still receive the event.
+// listener is discarded and the others still receive the event. The unwinding
+// of a thread that is cancelled or calls pthread_exit inside a listener is not
+// an error and passes through (releasing the lock).
 //
 // The hub holds its listeners strongly; sessions, node listeners and event
 // results hold the hub, which may therefore outlive its session.
@@ -65,6 +67,8 @@ protected:
 private:
     friend class Zel_Session;
     friend class Zel_EventRes;
+    // Takes itself out of the hub under the hub's lock (folder facades).
+    friend class Zel_EventListenerFolderImpl;
 
     typedef QMap<QString, Zel_EventListenerSPList> Table;
 

@@ -5,7 +5,8 @@
 // hands the event to the hub, which passes it on to its listeners. The result
 // names the hub to the engine as its callback and holds it, so the hub lives
 // at least as long as an undelivered event. One deliverNext() call delivers
-// the event; it always answers false. Exceptions are caught and discarded.
+// the event; it always answers false. Exceptions are caught and discarded,
+// except the unwinding of a thread that is cancelled or calls pthread_exit.
 #ifndef ZEL_EVENTRES_H
 #define ZEL_EVENTRES_H
 

@@ -18,14 +18,20 @@
 // registerEventListener moves it to another session (or again to the end of
 // the same session's list; a null session just unregisters it);
 // unregisterEventListener and the destructor unregister it, after which no
-// notification reaches it. The facade refers to its session weakly.
+// notification reaches it. The facade refers to its session weakly; it leaves
+// the session's event hub even when that session has died meanwhile while the
+// hub lives on (a copy of the session shares it, or an event is pending).
 //
 // Threads: the notifications run on the thread that delivers events, with the
-// hub's lock held. A facade is not copyable. If events can be delivered while
-// the facade is built or destroyed on another thread, call
-// unregisterEventListener() first thing in the derived destructor, and pass a
-// null session to the constructor and call registerEventListener() once the
-// derived object is complete.
+// hub's lock held. unregisterEventListener and the destructor take that lock,
+// so when they return no other thread is inside a notification of this
+// facade and none can enter one; a notification may unregister or destroy its
+// own facade. A facade is not copyable, and one facade is used by one thread
+// at a time. If events can be delivered while the facade is built or
+// destroyed on another thread, call unregisterEventListener() first thing in
+// the derived destructor (the derived part is gone by the time the base
+// destructor runs), and pass a null session to the constructor and call
+// registerEventListener() once the derived object is complete.
 #ifndef ZEL_IEVENTLISTENERFOLDER_H
 #define ZEL_IEVENTLISTENERFOLDER_H
 
@@ -46,13 +52,14 @@ public:
     virtual void childAdded(boost::shared_ptr<QString> parentMoniker, boost::shared_ptr<QString> childMoniker) override;
     virtual void childRemoved(boost::shared_ptr<QString> parentMoniker, boost::shared_ptr<QString> childMoniker) override;
     virtual void childUpdated(boost::shared_ptr<QString> parentMoniker, boost::shared_ptr<QString> childMoniker) override;
-    // Unregisters, then detaches the internal listener from this facade.
+    // Unregisters and cuts the internal listener off this facade.
     virtual ~Zel_IEventListenerFolder();
 
-    // Unregisters from the current session (if alive), then registers with
-    // this one (unless null).
+    // Unregisters as unregisterEventListener does, then registers with this
+    // session (unless null).
     void registerEventListener(boost::shared_ptr<Zel_Session> session);
-    // Unregisters from the current session (if alive) and forgets it.
+    // Unregisters from the hub of the current session (even if that session
+    // has died) and forgets the session.
     void unregisterEventListener();
 
     // The internal listener's mask operations; they answer its enabled mask.

@@ -10,9 +10,11 @@
 //     Zel_Property p(Zel_PropKey_Name, "clip 1", QString());
 //     QString shown = p.displayName();              // asks the registered manager
 //
-// The registration is a process-wide weak reference without a lock: register
-// the manager before other threads ask questions. Once the registered manager
-// is destroyed by its owner, the registration reads as empty.
+// The registration is a process-wide weak reference, read and written
+// atomically: any thread may register, clear or ask at any time. Once the
+// registered manager is destroyed by its owner, the registration reads as
+// empty. A question asked while another thread registers a new manager may
+// still be answered by the previous one.
 #ifndef ZEL_PROPERTY_H
 #define ZEL_PROPERTY_H
 

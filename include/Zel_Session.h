@@ -223,6 +223,9 @@ protected:
     void setBackendDataSP(const boost::shared_ptr<void>& data) { mBackendData = data; }
 
 private:
+    // Remembers the hub it is filed in (folder facades).
+    friend class Zel_EventListenerFolderImpl;
+
     class HubLease;
 
     boost::shared_ptr<void> mBackendData;

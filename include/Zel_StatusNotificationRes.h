@@ -4,7 +4,8 @@
 // Made by Zel_ConnectionListener and pushed onto the engine's result queue.
 // One deliverNext() call calls connected() for a Connected notification,
 // disconnected() for a Disconnected one and nothing for any other value;
-// it always answers false and discards exceptions from the handler.
+// it always answers false and discards exceptions from the handler (the
+// unwinding of a thread that is cancelled or calls pthread_exit passes through).
 #ifndef ZEL_STATUSNOTIFICATIONRES_H
 #define ZEL_STATUSNOTIFICATIONRES_H
 

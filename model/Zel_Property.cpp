@@ -2,6 +2,8 @@
 
 #include "Zel_PropertyManager.h"
 
+#include <boost/smart_ptr/detail/spinlock_pool.hpp>
+
 boost::weak_ptr<Zel_PropertyManager> Zel_Property::mPropertyManagerWP;
 
 namespace {
@@ -157,12 +159,22 @@ bool Zel_Property::getIsType(Zel_PropertyKeyType type, const QString& key)
     return true;
 }
 
+// Sessions register and clear their managers on their own threads while
+// other threads ask questions, so the registration is read and written under
+// the spin lock that boost's atomic shared-pointer operations use for the
+// same address: a few instructions, no user code and no allocation inside.
 void Zel_Property::setPropertyManagerSP(boost::shared_ptr<Zel_PropertyManager> manager)
 {
-    mPropertyManagerWP = manager;
+    boost::weak_ptr<Zel_PropertyManager> registration(manager);
+    {
+        boost::detail::spinlock_pool<2>::scoped_lock lock(&mPropertyManagerWP);
+        mPropertyManagerWP.swap(registration);
+    }
+    // The previous registration is released here, outside the lock.
 }
 
 boost::shared_ptr<Zel_PropertyManager> Zel_Property::getPropertyManagerSP()
 {
+    boost::detail::spinlock_pool<2>::scoped_lock lock(&mPropertyManagerWP);
     return mPropertyManagerWP.lock();
 }

@@ -19,6 +19,8 @@
 #include <functional>
 #include <mutex>
 
+#include <pthread.h>
+
 inline boost::shared_ptr<QString> moniker(const char* text)
 {
     return boost::shared_ptr<QString>(new QString(QString::fromLatin1(text)));
@@ -104,6 +106,22 @@ inline bool deliver(const boost::shared_ptr<Zel_EventCB>& hub, const boost::shar
 {
     Zel_EventRes result(hub, event);
     return result.deliverNext();
+}
+
+// Runs the function on a new POSIX thread, waits for it, and answers the value
+// the thread ended with: the function's answer, or what pthread_exit was given
+// (PTHREAD_CANCELED for a cancelled thread).
+inline void* runOnPosixThread(std::function<void*()> body)
+{
+    struct Trampoline {
+        static void* run(void* function) { return (*static_cast<std::function<void*()>*>(function))(); }
+    };
+    pthread_t thread;
+    if (pthread_create(&thread, nullptr, &Trampoline::run, &body) != 0)
+        return nullptr;
+    void* ended = nullptr;
+    pthread_join(thread, &ended);
+    return ended;
 }
 
 #endif

@@ -1,3 +1,4 @@
+#include "EventTestSupport.h"
 #include "Orv_Engine.h"
 #include "Orv_ResultQ.h"
 #include "VtableSlot.h"
@@ -126,6 +127,26 @@ TEST(Zel_StatusNotificationResTest, DeliversOnceByTypeAndAlwaysAnswersFalse)
     copy.deliverNext();
     EXPECT_EQ(callback->calls, QStringList({"disconnected"}));
     EXPECT_EQ(callback->getCallbackID().getValue(), -2);
+}
+
+TEST(Zel_StatusNotificationResTest, AThreadEndedInsideTheHandlerUnwindsThroughDelivery)
+{
+    // pthread_exit and cancellation unwind the thread with an exception that
+    // must not be swallowed (glibc aborts the process if it is).
+    struct EndingStatusCB : Zel_StatusNotificationCB {
+        void connected() override { pthread_exit(reinterpret_cast<void*>(42)); }
+        void disconnected() override
+        {
+            pthread_cancel(pthread_self());
+            pthread_testcancel();
+        }
+    };
+    boost::shared_ptr<EndingStatusCB> callback(new EndingStatusCB);
+    Zel_StatusNotificationRes connected(callback, Zel_StatusNotificationRes::Connected);
+    Zel_StatusNotificationRes disconnected(callback, Zel_StatusNotificationRes::Disconnected);
+    void* const delivered = reinterpret_cast<void*>(1);
+    EXPECT_EQ(runOnPosixThread([&] { connected.deliverNext(); return delivered; }), reinterpret_cast<void*>(42));
+    EXPECT_EQ(runOnPosixThread([&] { disconnected.deliverNext(); return delivered; }), PTHREAD_CANCELED);
 }
 
 TEST(Zel_StatusNotificationSlotTest, CallbackAndResultSlotOrder)

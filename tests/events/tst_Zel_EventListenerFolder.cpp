@@ -6,6 +6,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <type_traits>
 #include <utility>
 
@@ -61,6 +62,18 @@ boost::shared_ptr<Zel_Event> updatedEvent(const char* parent, const char* child)
 struct FacadeProbe : Zel_IEventListenerFolder {
     FacadeProbe() : Zel_IEventListenerFolder(boost::shared_ptr<QString>(), 0, boost::shared_ptr<Zel_Session>()) {}
     virtual void firstNewSlot() {}
+};
+
+// A session whose destructor body runs code while the session can no longer
+// be reached through a weak reference and its hub has not been emptied yet.
+struct DyingSession : StubSession {
+    using StubSession::StubSession;
+    ~DyingSession() override
+    {
+        if (onDestroy)
+            onDestroy();
+    }
+    std::function<void()> onDestroy;
 };
 
 class Zel_IEventListenerFolderTest : public ::testing::Test
@@ -193,8 +206,8 @@ TEST_F(Zel_IEventListenerFolderTest, DestroyedFacadeIsUnregisteredAndNeverCalled
     deliver(hub, addedEvent("/f", "d"));
     EXPECT_EQ(log.lines(), QStringList({"w added /f c"}));
 
-    // Registered through a session copy that dies first, the internal listener
-    // stays in the shared hub; once the facade is gone it calls nobody.
+    // Registered through a session copy that dies first, it still hears the
+    // shared hub while it lives, and nothing once it is gone.
     boost::shared_ptr<StubSession> copy(new StubSession(*session));
     {
         FolderWatch watch(&log, "v", moniker("/g"), 7, copy);
@@ -204,7 +217,8 @@ TEST_F(Zel_IEventListenerFolderTest, DestroyedFacadeIsUnregisteredAndNeverCalled
     deliver(hub, addedEvent("/g", "d"));
     EXPECT_EQ(log.lines(), QStringList({"w added /f c", "v added /g c"}));
 
-    // A dead session is only forgotten.
+    // After the last session died (and emptied its hub), unregistering has
+    // nothing left to do.
     FolderWatch dead(&log, "x", moniker("/h"), 7, session);
     session.reset();
     dead.unregisterEventListener();
@@ -212,6 +226,95 @@ TEST_F(Zel_IEventListenerFolderTest, DestroyedFacadeIsUnregisteredAndNeverCalled
     EXPECT_FALSE(hub->hasRegisteredListener(moniker("/h")));
     deliver(hub, addedEvent("/h", "c"));
     EXPECT_EQ(log.lines().size(), 2);
+}
+
+TEST_F(Zel_IEventListenerFolderTest, LeavesTheSharedHubWhenTheSessionCopyItRegisteredWithHasDied)
+{
+    // The moniker is held by the internal listener only: its count tells
+    // whether a hub still holds that listener once the facade is gone.
+    const boost::shared_ptr<QString> key = moniker("/g");
+    boost::shared_ptr<StubSession> copy(new StubSession(*session));
+    FolderWatch* watch = new FolderWatch(&log, "v", key, 7, copy);
+    copy.reset(); // the hub lives on in the original session
+    deliver(hub, addedEvent("/g", "c"));
+
+    watch->unregisterEventListener();
+    deliver(hub, addedEvent("/g", "d"));
+    EXPECT_EQ(log.lines(), QStringList({"v added /g c"}));
+
+    // Moving to another session leaves the shared hub as well.
+    copy.reset(new StubSession(*session));
+    watch->registerEventListener(copy);
+    copy.reset();
+    boost::shared_ptr<StubSession> other(new StubSession);
+    watch->registerEventListener(other);
+    log.clear();
+    deliver(hub, addedEvent("/g", "e"));
+    deliver(other->getEventCBSP(), addedEvent("/g", "f"));
+    EXPECT_EQ(log.lines(), QStringList({"v added /g f"}));
+
+    // Registered through a dead copy again, then destroyed: the hub lets go of
+    // the internal listener and calls nobody.
+    copy.reset(new StubSession(*session));
+    watch->registerEventListener(copy);
+    copy.reset();
+    delete watch;
+    EXPECT_EQ(key.use_count(), 1);
+    log.clear();
+    deliver(hub, addedEvent("/g", "g"));
+    deliver(other->getEventCBSP(), addedEvent("/g", "h"));
+    EXPECT_TRUE(log.lines().isEmpty());
+}
+
+TEST_F(Zel_IEventListenerFolderTest, LeavesTheHubWhileItsLastSessionIsBeingDestroyed)
+{
+    // The backend's session destructor runs while no weak reference reaches
+    // the session any more and before the hub is emptied; a result still
+    // holds the hub.
+    const boost::shared_ptr<QString> kept = moniker("/k");
+    const boost::shared_ptr<QString> gone = moniker("/k");
+    boost::shared_ptr<DyingSession> dying(new DyingSession);
+    boost::shared_ptr<Zel_EventCB> dyingHub = dying->getEventCBSP();
+    FolderWatch unregistered(&log, "u", kept, 7, dying);
+    FolderWatch* destroyed = new FolderWatch(&log, "d", gone, 7, dying);
+    bool ran = false;
+    dying->onDestroy = [&] {
+        unregistered.unregisterEventListener();
+        delete destroyed;
+        EXPECT_EQ(gone.use_count(), 1) << "the destroyed facade's listener is still in the hub";
+        deliver(dyingHub, addedEvent("/k", "c"));
+        ran = true;
+    };
+    dying.reset();
+    EXPECT_TRUE(ran);
+    EXPECT_TRUE(log.lines().isEmpty());
+}
+
+TEST_F(Zel_IEventListenerFolderTest, AFacadeMayDestroyItselfOrAnotherFromItsOwnNotification)
+{
+    boost::shared_ptr<StubSession> copy(new StubSession(*session));
+    const boost::shared_ptr<QString> key = moniker("/s");
+    struct SelfDestroying : FolderWatch {
+        using FolderWatch::FolderWatch;
+        void childAdded(boost::shared_ptr<QString> p, boost::shared_ptr<QString> c) override
+        {
+            FolderWatch::childAdded(p, c);
+            delete victim;
+            delete this;
+        }
+        FolderWatch* victim = nullptr;
+    };
+    SelfDestroying* first = new SelfDestroying(&log, "first", key, 7, copy);
+    first->victim = new FolderWatch(&log, "second", key, 7, copy);
+    FolderWatch third(&log, "third", key, 7, copy);
+    copy.reset();
+
+    // The first destroys the second, which is then skipped, and itself; the
+    // third still hears this event, and only the third hears the next one.
+    deliver(hub, addedEvent("/s", "c"));
+    deliver(hub, addedEvent("/s", "d"));
+    EXPECT_EQ(log.lines(), QStringList({"first added /s c", "third added /s c", "third added /s d"}));
+    EXPECT_EQ(key.use_count(), 2) << "only the test and the third's listener hold the moniker";
 }
 
 TEST(Zel_IEventListenerFolderSlotTest, SlotOrderAndCopyRules)
