@@ -55,7 +55,7 @@ struct CountingFolder : Zel_IEventListenerFolder {
 
 constexpr long kMinimumCalls = 2000;
 
-TEST(Zel_EventCBConcurrencyTest, RegistrationsRaceDeliveryWithoutLateCallsOrDeadlock)
+TEST(Zel_EventCBThreadTest, RegistrationsRaceDeliveryWithoutLateCallsOrDeadlock)
 {
     boost::shared_ptr<StubSession> session(new StubSession);
     Orv_Engine engine(1);
@@ -144,7 +144,7 @@ TEST(Zel_EventCBConcurrencyTest, RegistrationsRaceDeliveryWithoutLateCallsOrDead
     EXPECT_EQ(everyNode.use_count(), 1);
 }
 
-TEST(Zel_EventCBConcurrencyTest, ListenersRegisteringFromTheirOwnCallsOnTheDeliveringThreadDoNotDeadlock)
+TEST(Zel_EventCBThreadTest, ListenersRegisteringFromTheirOwnCallsOnTheDeliveringThreadDoNotDeadlock)
 {
     boost::shared_ptr<StubSession> session(new StubSession);
     Orv_Engine engine(1);
