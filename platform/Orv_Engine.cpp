@@ -6,8 +6,48 @@
 #include "Orv_ResultQ.h"
 #include "Orv_ResultsCB.h"
 
+#ifdef __GLIBCXX__
+#include <cxxabi.h>
+#endif
+
 #include <exception>
 #include <string>
+
+namespace {
+
+// Calls the result's deliverNext() until it answers false. An exception is
+// logged and taken as "more to come"; after MaxDeliveryFailuresInARow
+// exceptions in a row the result is ended. The unwinding that cancels a
+// thread is let through.
+void deliverToEnd(Orv_Result& result)
+{
+    int failuresInARow = 0;
+    for (;;) {
+        std::string failure;
+        try {
+            if (!result.deliverNext())
+                return;
+            failuresInARow = 0;
+            continue;
+        }
+#ifdef __GLIBCXX__
+        catch (abi::__forced_unwind&) {
+            throw;
+        }
+#endif
+        catch (const std::exception& e) {
+            failure = e.what();
+        } catch (...) {
+            failure = "unknown exception";
+        }
+        const std::string line = "orv: delivery of a result failed: " + failure;
+        Orv::log(line.c_str());
+        if (++failuresInARow == Orv_Engine::MaxDeliveryFailuresInARow)
+            return;
+    }
+}
+
+} // namespace
 
 Orv_Engine::Orv_Engine(unsigned workerCount)
     : mResultQ(new Orv_ResultQ)
@@ -56,8 +96,7 @@ std::size_t Orv_Engine::DeliverPending()
         boost::shared_ptr<Orv_Result> result = mResultQ->TryPop();
         if (!result)
             break;
-        while (result->deliverNext()) {
-        }
+        deliverToEnd(*result);
         if (result->isFinalResult() && result->getCallback())
             result->getCallback()->setFinished(true);
         ++delivered;

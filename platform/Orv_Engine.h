@@ -11,6 +11,14 @@
 //     engine.Submit(request);
 //     engine.DeliverAll();               // waits for the work, delivers the answers
 //
+// A deliverNext() that throws does not stop delivery: the exception is logged
+// through Orv::log ("orv: delivery of a result failed: <what>") and the engine
+// calls deliverNext() of the same result again, as if it had answered true,
+// so that the items after the failing one still arrive. A result whose
+// deliverNext() throws MaxDeliveryFailuresInARow times in a row is ended
+// there. Either way a final result marks its callback finished, and the
+// results queued behind it are delivered as usual.
+//
 // Submit, WaitIdle and the result queue are thread-safe. Delivery methods are
 // meant to be called from one thread at a time (the application's thread).
 // The destructor finishes the requests that are running, drops the ones still
@@ -36,6 +44,9 @@ class Orv_ResultQ;
 class ZEL_PLATFORM_EXPORT Orv_Engine
 {
 public:
+    // A result whose deliverNext() throws this many times in a row is ended.
+    static constexpr int MaxDeliveryFailuresInARow = 8;
+
     explicit Orv_Engine(unsigned workerCount = 2);
     ~Orv_Engine();
 
