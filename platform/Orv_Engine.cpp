@@ -49,8 +49,35 @@ void deliverToEnd(Orv_Result& result)
 
 } // namespace
 
+// --- Orv_EngineHandle ---------------------------------------------------------
+
+Orv_EngineHandle::Orv_EngineHandle(Orv_Engine* engine)
+    : mEngine(engine)
+{
+}
+
+bool Orv_EngineHandle::Submit(boost::shared_ptr<Orv_Request> request)
+{
+    if (!request)
+        return false;
+    std::shared_lock<std::shared_mutex> lock(mMutex);
+    if (!mEngine)
+        return false;
+    mEngine->Submit(std::move(request));
+    return true;
+}
+
+void Orv_EngineHandle::close()
+{
+    std::unique_lock<std::shared_mutex> lock(mMutex);
+    mEngine = nullptr;
+}
+
+// --- Orv_Engine -------------------------------------------------------------------
+
 Orv_Engine::Orv_Engine(unsigned workerCount)
     : mResultQ(new Orv_ResultQ)
+    , mHandle(new Orv_EngineHandle(this))
 {
     if (workerCount == 0)
         workerCount = 1;
@@ -61,6 +88,9 @@ Orv_Engine::Orv_Engine(unsigned workerCount)
 
 Orv_Engine::~Orv_Engine()
 {
+    // From here on the handle refuses requests; one it is handing over now
+    // is queued before this returns, and dropped below with the rest.
+    mHandle->close();
     {
         std::lock_guard<std::mutex> lock(mMutex);
         mStopping = true;
@@ -80,6 +110,11 @@ void Orv_Engine::Submit(boost::shared_ptr<Orv_Request> request)
         mRequests.push_back(std::move(request));
     }
     mWork.notify_one();
+}
+
+boost::shared_ptr<Orv_EngineHandle> Orv_Engine::getHandle() const
+{
+    return mHandle;
 }
 
 boost::shared_ptr<Orv_ResultQ> Orv_Engine::getResultQ() const

@@ -201,8 +201,10 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     , mState(new ZelMemory::SessionState)
 {
     mState->tree = tree ? tree : Zel_MemoryTree::sample();
-    mState->engine = engine;
-    mState->resultQ = engine ? engine->getResultQ() : boost::shared_ptr<Orv_ResultQ>();
+    if (engine) {
+        mState->engine = engine->getHandle();
+        mState->resultQ = engine->getResultQ();
+    }
     mState->applicationName = applicationName;
     mState->setOwner(this);
     setBackendDataSP(mState);
@@ -312,8 +314,9 @@ bool Zel_MemorySession::submitRequest(boost::shared_ptr<Orv_Request> request)
 {
     if (!request || !mState->engine || mState->closed.load())
         return false;
-    mState->engine->Submit(request);
-    return true;
+    // False when the engine is gone: the request is not run and its callback
+    // hears nothing.
+    return mState->engine->Submit(std::move(request));
 }
 
 void Zel_MemorySession::cancelAllRequests()

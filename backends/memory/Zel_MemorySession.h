@@ -58,8 +58,10 @@ class ZEL_MEMORY_EXPORT Zel_MemorySession : public Zel_Session
 {
 public:
     // A session on the tree (the bundled sample when tree is empty) whose
-    // requests run on the engine, which must outlive the session's requests;
-    // without an engine submitRequest() answers false and no events are sent.
+    // requests run on the engine. The session may outlive the engine: once
+    // the engine's destruction has begun, submitRequest() answers false (the
+    // request is not run and its callback hears nothing). Without an engine
+    // submitRequest() answers false and no events are sent.
     // applicationName names the application's settings on the server.
     Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tree, Orv_Engine* engine,
                       const QString& applicationName = QStringLiteral("zel"));

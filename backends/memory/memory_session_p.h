@@ -31,7 +31,7 @@
 #include <mutex>
 #include <vector>
 
-class Orv_Engine;
+class Orv_EngineHandle;
 class Zel_EventCB;
 class Zel_Node;
 class Zel_NodeListener;
@@ -73,7 +73,7 @@ class SessionState
 {
 public:
     boost::shared_ptr<Zel_MemoryTree> tree;
-    Orv_Engine* engine = nullptr;
+    boost::shared_ptr<Orv_EngineHandle> engine; // refuses requests once the engine is gone
     boost::shared_ptr<Orv_ResultQ> resultQ;
     QString applicationName;
     std::atomic<bool> connected{true};

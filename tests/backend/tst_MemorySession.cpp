@@ -10,6 +10,8 @@
 
 #include <QDateTime>
 
+#include <memory>
+
 using namespace Sample;
 
 typedef BackendFixture Zel_MemorySessionTest;
@@ -696,4 +698,42 @@ TEST_F(Zel_MemorySessionTest, NamesTheServerMakesStayWithinTheNameLimit)
         run(session->makeRenameNodeReqSP(mk(node->getMoniker()), node->getName(), rename));
         EXPECT_TRUE(rename->codes.isEmpty()) << node->getName().toStdString();
     }
+}
+
+// The session may outlive its engine: it then refuses requests, and neither
+// that nor its end touches the engine that is gone.
+TEST(Zel_MemorySessionLifetimeTest, SessionOutlivingItsEngineRefusesRequestsAndEndsCleanly)
+{
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    std::unique_ptr<Orv_Engine> engine(new Orv_Engine(2));
+    boost::shared_ptr<Zel_MemorySession> session(new Zel_MemorySession(tree, engine.get()));
+    auto login = rec<LoginRec>();
+    ASSERT_TRUE(session->submitRequest(session->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login)));
+    engine->DeliverAll();
+    ASSERT_EQ(1, login->ok);
+    std::unique_ptr<FolderRec> footage(new FolderRec(m(Footage), session));
+
+    engine.reset();
+    auto node = rec<NodeRec>();
+    const boost::shared_ptr<Zel_GetNodeReq> request = session->makeGetNodeReqSP(mk(m(Mayor)), node);
+    ASSERT_TRUE(request);
+    EXPECT_FALSE(session->submitRequest(request));
+    EXPECT_FALSE(session->submitRequest(session->makeGetNodeReqSP(mk(m(Mayor)), node)));
+
+    // Another session on the same tree, on an engine of its own, changes the
+    // bin the first one listens to: the report goes nowhere near the old engine.
+    {
+        Orv_Engine other(1);
+        boost::shared_ptr<Zel_MemorySession> producer(new Zel_MemorySession(tree, &other));
+        auto login2 = rec<LoginRec>();
+        producer->submitRequest(producer->makeLoginReqSP(QStringLiteral("producer"), QStringLiteral("producer"), {}, login2));
+        auto created = rec<CreateFolderRec>();
+        producer->submitRequest(producer->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Late"), created));
+        other.DeliverAll();
+        EXPECT_EQ(1, created->ok);
+    }
+    EXPECT_TRUE(footage->events().isEmpty()); // nobody delivers the first session's results any more
+    footage.reset();
+    session.reset();
+    EXPECT_TRUE(node->log.isEmpty()) << node->log.join(QLatin1Char(',')).toStdString();
 }

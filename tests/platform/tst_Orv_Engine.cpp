@@ -13,6 +13,7 @@
 #include <algorithm>
 #include <atomic>
 #include <climits>
+#include <memory>
 #include <cstdint>
 #include <mutex>
 #include <stdexcept>
@@ -302,6 +303,57 @@ TEST(Orv_EngineTest, ResultThatThrowsOnEveryCallIsEndedInsteadOfSpinning)
     const std::vector<std::string> lines = log.lines();
     ASSERT_EQ(static_cast<std::size_t>(Orv_Engine::MaxDeliveryFailuresInARow), lines.size());
     EXPECT_EQ("orv: delivery of a result failed: unknown exception", lines.back());
+}
+
+TEST(Orv_EngineTest, HandleRefusesRequestsOnceTheEngineIsGone)
+{
+    auto cb = boost::make_shared<LogCB>();
+    auto before = boost::make_shared<PushingRequest>(cb, "before", 1);
+    boost::shared_ptr<Orv_EngineHandle> handle;
+    {
+        Orv_Engine engine(1);
+        handle = engine.getHandle();
+        EXPECT_TRUE(handle->Submit(before));
+        EXPECT_FALSE(handle->Submit(boost::shared_ptr<Orv_Request>()));
+        engine.DeliverAll();
+    }
+    auto after = boost::make_shared<PushingRequest>(cb, "after", 1);
+    EXPECT_FALSE(handle->Submit(after));
+    EXPECT_EQ(1, before->mProcessed.load());
+    EXPECT_EQ(0, after->mProcessed.load());
+    EXPECT_EQ(1, after.use_count()) << "a refused request is not kept";
+    EXPECT_EQ((std::vector<std::string>{"before/0:0", "before/0:1"}), cb->delivered);
+}
+
+TEST(Orv_EngineTest, HandleSubmittingFromThreadsWhileTheEngineGoesNeverRunsARefusedRequest)
+{
+    for (int round = 0; round < 20; ++round) {
+        auto cb = boost::make_shared<LogCB>();
+        std::unique_ptr<Orv_Engine> engine(new Orv_Engine(2));
+        const boost::shared_ptr<Orv_EngineHandle> handle = engine->getHandle();
+        std::atomic<bool> go(false);
+        std::vector<std::vector<boost::shared_ptr<PushingRequest>>> refused(2);
+        std::vector<std::thread> submitters;
+        for (int t = 0; t < 2; ++t) {
+            submitters.emplace_back([&, t] {
+                while (!go.load())
+                    std::this_thread::yield();
+                for (int i = 0; i < 200; ++i) {
+                    auto request = boost::make_shared<PushingRequest>(cb, "x", 1);
+                    if (!handle->Submit(request))
+                        refused[t].push_back(request);
+                }
+            });
+        }
+        go = true;
+        engine.reset(); // while the submitters run
+        for (std::thread& t : submitters)
+            t.join();
+        EXPECT_FALSE(handle->Submit(boost::make_shared<PushingRequest>(cb, "late", 1)));
+        for (const auto& mine : refused)
+            for (const auto& request : mine)
+                EXPECT_EQ(0, request->mProcessed.load());
+    }
 }
 
 TEST(Orv_EngineTest, RequestIdentifiersWrapPastTheReservedValues)
