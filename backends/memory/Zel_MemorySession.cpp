@@ -206,7 +206,9 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
         mState->resultQ = engine->getResultQ();
     }
     mState->applicationName = applicationName;
-    mState->setOwner(this);
+    // This class's rules until the first request is made (a derived session's
+    // own are not reachable yet).
+    mState->setNameRules(illegalAssetNameCharacters(), illegalPropertyNameCharacters());
     setBackendDataSP(mState);
     setRemoteClientStatus(false);
 
@@ -220,7 +222,6 @@ Zel_MemorySession::~Zel_MemorySession()
 {
     // Requests that outlive the session fail with NotConnected from now on.
     mState->closed = true;
-    mState->setOwner(nullptr);
     mState->tree->data().removeObserver(mObserver.get());
     unregisterManager(mPropertyManager);
 }
@@ -419,6 +420,9 @@ boost::shared_ptr<Req> Zel_MemorySession::make(const boost::shared_ptr<Callback>
 {
     if (mState->closed.load())
         return boost::shared_ptr<Req>();
+    // The request's work checks names against the rules as they stand now,
+    // taken here on the caller's thread: it never calls into the session.
+    mState->setNameRules(illegalAssetNameCharacters(), illegalPropertyNameCharacters());
     boost::shared_ptr<Concrete> request(new Concrete(callback, mState, args));
     mState->track(request);
     return request;

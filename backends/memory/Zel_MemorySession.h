@@ -33,7 +33,12 @@
 // called from any thread; simulateConnectionLoss, simulateReconnect and close
 // belong to the application's thread (they write the base class's plain
 // connection flag). Name rules: asset names may not contain / \ : * ? " < > |
-// and are at most 128 characters long.
+// and are at most 128 characters long. A derived session may change the
+// illegal characters (illegalAssetNameCharacters, illegalPropertyNameCharacters):
+// each request factory asks for them on the caller's thread, and the request's
+// work checks names against what they answered then; the work never calls
+// into the session, so a session may go while its requests run (those that
+// have not passed their checks yet then fail with NotConnected).
 #ifndef ZEL_MEMORYSESSION_H
 #define ZEL_MEMORYSESSION_H
 

@@ -7,7 +7,6 @@
 #include "Zel_EventRes.h"
 #include "Zel_MimeTypeSpec.h"
 #include "Zel_NodeListener.h"
-#include "Zel_Session.h"
 
 namespace ZelMemory {
 
@@ -19,6 +18,27 @@ const unsigned long MediaMask = 0x1981FF;
 boost::shared_ptr<QString> shared(const QString& text)
 {
     return boost::shared_ptr<QString>(new QString(text));
+}
+
+// The session's rule for names, as Zel_Session::isValidName states it: at
+// least one word character (a letter, a digit, a mark or the underscore) and
+// none of the illegal characters.
+bool followsNameRule(const QString& name, const QString& illegalCharacters)
+{
+    bool hasWordCharacter = false;
+    for (const QChar c : name) {
+        if (c.isLetterOrNumber() || c.isMark() || c == QLatin1Char('_')) {
+            hasWordCharacter = true;
+            break;
+        }
+    }
+    if (!hasWordCharacter)
+        return false;
+    for (const QChar c : illegalCharacters) {
+        if (name.contains(c))
+            return false;
+    }
+    return true;
 }
 
 } // namespace
@@ -102,34 +122,40 @@ QDateTime SessionState::loginTime() const
     return mLoginTime;
 }
 
-void SessionState::setOwner(const Zel_Session* owner)
+void SessionState::setNameRules(const QString& illegalAssetCharacters, const QString& illegalPropertyCharacters)
 {
     std::lock_guard<std::mutex> lock(mMutex);
-    mOwner = owner;
+    mIllegalAssetCharacters = illegalAssetCharacters;
+    mIllegalPropertyCharacters = illegalPropertyCharacters;
+}
+
+void SessionState::requireOpen() const
+{
+    if (closed.load())
+        fail(Zel_MemoryErrorCodes::NotConnected, QStringLiteral("The session is closed."));
 }
 
 bool SessionState::isValidAssetName(const QString& name) const
 {
-    std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner && mOwner->isValidAssetName(name);
+    requireOpen();
+    return followsNameRule(name, illegalAssetCharacters());
 }
 
 bool SessionState::isValidPropertyName(const QString& name) const
 {
-    std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner && mOwner->isValidPropertyName(name);
+    requireOpen();
+    QString illegal;
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        illegal = mIllegalPropertyCharacters;
+    }
+    return followsNameRule(name, illegal);
 }
 
 QString SessionState::illegalAssetCharacters() const
 {
     std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner ? mOwner->illegalAssetNameCharacters() : QString();
-}
-
-bool SessionState::sessionAlive() const
-{
-    std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner != nullptr;
+    return mIllegalAssetCharacters;
 }
 
 void SessionState::track(const boost::shared_ptr<Cancelable>& request)
@@ -166,7 +192,7 @@ Work::Work(SessionState& s, bool needsLogin)
     , tree(s.tree->data())
     , user(s.user())
 {
-    if (session.closed.load() || !session.sessionAlive())
+    if (session.closed.load())
         fail(Zel_MemoryErrorCodes::NotConnected, QStringLiteral("The session is closed."));
     if (!session.connected.load())
         fail(Zel_MemoryErrorCodes::NotConnected,

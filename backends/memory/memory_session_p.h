@@ -35,7 +35,6 @@ class Orv_EngineHandle;
 class Zel_EventCB;
 class Zel_Node;
 class Zel_NodeListener;
-class Zel_Session;
 
 namespace ZelMemory {
 
@@ -86,22 +85,29 @@ public:
     QString sessionID() const;
     QDateTime loginTime() const;
 
-    // Name validation through the session (while it lives).
-    void setOwner(const Zel_Session* owner);
+    // Names are checked by the session's rule (Zel_Session::isValidName)
+    // against the illegal characters the session gave when it last made a
+    // request (setNameRules): the work never calls into the session, which
+    // may be going or gone while a request runs. Once the session is closed
+    // the checks throw NotConnected.
+    void setNameRules(const QString& illegalAssetCharacters, const QString& illegalPropertyCharacters);
     bool isValidAssetName(const QString& name) const;
     bool isValidPropertyName(const QString& name) const;
-    bool sessionAlive() const;
     QString illegalAssetCharacters() const;
 
+    // Keeps a weak reference to the request, for cancelAll().
     void track(const boost::shared_ptr<Cancelable>& request);
     void cancelAll();
 
 private:
+    void requireOpen() const;
+
     mutable std::mutex mMutex;
     QString mUser;
     QString mSessionID;
     QDateTime mLoginTime;
-    const Zel_Session* mOwner = nullptr;
+    QString mIllegalAssetCharacters;
+    QString mIllegalPropertyCharacters;
     std::vector<boost::weak_ptr<Cancelable>> mRequests;
 };
 
