@@ -212,7 +212,7 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     setBackendDataSP(mState);
     setRemoteClientStatus(false);
 
-    mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ));
+    mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ, mState));
     mState->tree->data().addObserver(mObserver);
     mPropertyManager = mState->tree->data().propertyManager;
     registerManager(mPropertyManager);

@@ -19,7 +19,9 @@
 // listeners registered with this session, in the order they were made:
 // created, copied, checked-in, moved-in nodes as child added, deleted and
 // moved-out nodes as child removed, renamed nodes and changes of properties,
-// reservations, locators and media as child updated.
+// reservations, locators and media as child updated. A session hears only of
+// changes under parents its logged-in user may read (judged when the change
+// is reported); before login it hears nothing.
 //
 // The tree's property manager is registered (Zel_Property::setPropertyManagerSP)
 // for the session's life; while several sessions live, the newest one's is.

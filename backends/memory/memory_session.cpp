@@ -53,9 +53,11 @@ Cancelable::~Cancelable() = default;
 // --- SessionObserver --------------------------------------------------------
 
 SessionObserver::SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub,
-                                 const boost::shared_ptr<Orv_ResultQ>& resultQ)
+                                 const boost::shared_ptr<Orv_ResultQ>& resultQ,
+                                 const boost::shared_ptr<SessionState>& session)
     : mHub(hub)
     , mResultQ(resultQ)
+    , mSession(session)
     , mNodeListener(new Zel_NodeListener(hub, resultQ))
 {
 }
@@ -64,7 +66,34 @@ SessionObserver::~SessionObserver() = default;
 
 void SessionObserver::treeChanged(const std::vector<Change>& changes)
 {
-    for (const Change& change : changes) {
+    // Which changes the user may hear of: decided under one shared hold of
+    // the tree for the whole batch, which is released before the hub is
+    // called (the tree's lock is never held while waiting for the hub's).
+    const QString user = mSession->user();
+    if (user.isEmpty())
+        return;
+    std::vector<const Change*> readable;
+    readable.reserve(changes.size());
+    {
+        const Tree& tree = mSession->tree->data();
+        ReadHold hold(tree);
+        const User* account = tree.user(user);
+        if (!account)
+            return;
+        const QString* lastParent = nullptr;
+        bool lastReadable = false;
+        for (const Change& change : changes) {
+            if (!lastParent || *lastParent != change.parentMoniker) {
+                const Node* parent = tree.byMoniker(change.parentMoniker);
+                lastReadable = parent ? (tree.permissionsOf(user, *parent) & PermRead) != 0 : account->admin;
+                lastParent = &change.parentMoniker;
+            }
+            if (lastReadable)
+                readable.push_back(&change);
+        }
+    }
+    for (const Change* readableChange : readable) {
+        const Change& change = *readableChange;
         const boost::shared_ptr<QString> parent = shared(change.parentMoniker);
         const boost::shared_ptr<QString> child = shared(change.childMoniker);
         switch (change.kind) {

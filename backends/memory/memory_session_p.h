@@ -52,19 +52,27 @@ public:
     virtual void cancel() = 0;
 };
 
+class SessionState;
+
 // Hands the tree's changes to one session's listeners: added and removed
 // children through a Zel_NodeListener, updated children as child-updated
 // events under the same rule (only when someone listens for the parent).
+// Only changes under a parent that the session's user may read are passed
+// on (judged when the change is published; a session without a user hears
+// nothing, and a parent that is gone by then counts as unreadable except for
+// an administrator), so events never name nodes the user may not see.
 class SessionObserver : public Observer
 {
 public:
-    SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub, const boost::shared_ptr<Orv_ResultQ>& resultQ);
+    SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub, const boost::shared_ptr<Orv_ResultQ>& resultQ,
+                    const boost::shared_ptr<SessionState>& session);
     ~SessionObserver() override;
     void treeChanged(const std::vector<Change>& changes) override;
 
 private:
     boost::shared_ptr<Zel_EventCB> mHub;
     boost::shared_ptr<Orv_ResultQ> mResultQ;
+    boost::shared_ptr<SessionState> mSession;
     std::unique_ptr<Zel_NodeListener> mNodeListener;
 };
 
