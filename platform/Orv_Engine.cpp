@@ -6,11 +6,78 @@
 #include "Orv_ResultQ.h"
 #include "Orv_ResultsCB.h"
 
+#ifdef __GLIBCXX__
+#include <cxxabi.h>
+#endif
+
 #include <exception>
 #include <string>
 
+namespace {
+
+// Calls the result's deliverNext() until it answers false. An exception is
+// logged and taken as "more to come"; after MaxDeliveryFailuresInARow
+// exceptions in a row the result is ended. The unwinding that cancels a
+// thread is let through.
+void deliverToEnd(Orv_Result& result)
+{
+    int failuresInARow = 0;
+    for (;;) {
+        std::string failure;
+        try {
+            if (!result.deliverNext())
+                return;
+            failuresInARow = 0;
+            continue;
+        }
+#ifdef __GLIBCXX__
+        catch (abi::__forced_unwind&) {
+            throw;
+        }
+#endif
+        catch (const std::exception& e) {
+            failure = e.what();
+        } catch (...) {
+            failure = "unknown exception";
+        }
+        const std::string line = "orv: delivery of a result failed: " + failure;
+        Orv::log(line.c_str());
+        if (++failuresInARow == Orv_Engine::MaxDeliveryFailuresInARow)
+            return;
+    }
+}
+
+} // namespace
+
+// --- Orv_EngineHandle ---------------------------------------------------------
+
+Orv_EngineHandle::Orv_EngineHandle(Orv_Engine* engine)
+    : mEngine(engine)
+{
+}
+
+bool Orv_EngineHandle::Submit(boost::shared_ptr<Orv_Request> request)
+{
+    if (!request)
+        return false;
+    std::shared_lock<std::shared_mutex> lock(mMutex);
+    if (!mEngine)
+        return false;
+    mEngine->Submit(std::move(request));
+    return true;
+}
+
+void Orv_EngineHandle::close()
+{
+    std::unique_lock<std::shared_mutex> lock(mMutex);
+    mEngine = nullptr;
+}
+
+// --- Orv_Engine -------------------------------------------------------------------
+
 Orv_Engine::Orv_Engine(unsigned workerCount)
     : mResultQ(new Orv_ResultQ)
+    , mHandle(new Orv_EngineHandle(this))
 {
     if (workerCount == 0)
         workerCount = 1;
@@ -21,6 +88,9 @@ Orv_Engine::Orv_Engine(unsigned workerCount)
 
 Orv_Engine::~Orv_Engine()
 {
+    // From here on the handle refuses requests; one it is handing over now
+    // is queued before this returns, and dropped below with the rest.
+    mHandle->close();
     {
         std::lock_guard<std::mutex> lock(mMutex);
         mStopping = true;
@@ -42,6 +112,11 @@ void Orv_Engine::Submit(boost::shared_ptr<Orv_Request> request)
     mWork.notify_one();
 }
 
+boost::shared_ptr<Orv_EngineHandle> Orv_Engine::getHandle() const
+{
+    return mHandle;
+}
+
 boost::shared_ptr<Orv_ResultQ> Orv_Engine::getResultQ() const
 {
     return mResultQ;
@@ -56,8 +131,7 @@ std::size_t Orv_Engine::DeliverPending()
         boost::shared_ptr<Orv_Result> result = mResultQ->TryPop();
         if (!result)
             break;
-        while (result->deliverNext()) {
-        }
+        deliverToEnd(*result);
         if (result->isFinalResult() && result->getCallback())
             result->getCallback()->setFinished(true);
         ++delivered;

@@ -11,10 +11,22 @@
 //     engine.Submit(request);
 //     engine.DeliverAll();               // waits for the work, delivers the answers
 //
-// Submit, WaitIdle and the result queue are thread-safe. Delivery methods are
-// meant to be called from one thread at a time (the application's thread).
-// The destructor finishes the requests that are running, drops the ones still
-// queued, and joins the workers.
+// A deliverNext() that throws does not stop delivery: the exception is logged
+// through Orv::log ("orv: delivery of a result failed: <what>") and the engine
+// calls deliverNext() of the same result again, as if it had answered true,
+// so that the items after the failing one still arrive. A result whose
+// deliverNext() throws MaxDeliveryFailuresInARow times in a row is ended
+// there. Either way a final result marks its callback finished, and the
+// results queued behind it are delivered as usual.
+//
+// Whoever may outlive the engine (a session, for example) keeps its handle
+// (getHandle()) instead of a pointer: the handle passes requests on while the
+// engine lives and refuses them once its destruction has begun.
+//
+// Submit, WaitIdle, the handle and the result queue are thread-safe. Delivery
+// methods are meant to be called from one thread at a time (the application's
+// thread). The destructor first closes the handle, then finishes the requests
+// that are running, drops the ones still queued, and joins the workers.
 #ifndef ORV_ENGINE_H
 #define ORV_ENGINE_H
 
@@ -27,20 +39,52 @@
 #include <cstddef>
 #include <deque>
 #include <mutex>
+#include <shared_mutex>
 #include <thread>
 #include <vector>
 
+class Orv_Engine;
 class Orv_Request;
 class Orv_ResultQ;
+
+// Orv_EngineHandle: a reference to an engine that may be used in any order
+// with the engine's destruction. Submit() hands a request to the engine while
+// it lives and answers true; once the engine's destructor has begun it
+// answers false and leaves the request alone. The engine's destructor waits
+// for a Submit() that is handing a request over, so the engine is never used
+// after it is gone. Made by the engine only; shared with its users.
+class ZEL_PLATFORM_EXPORT Orv_EngineHandle
+{
+public:
+    // Queues a request on the engine; false (nothing queued) when the
+    // request is empty or the engine is gone.
+    bool Submit(boost::shared_ptr<Orv_Request> request);
+
+private:
+    friend class Orv_Engine;
+    explicit Orv_EngineHandle(Orv_Engine* engine);
+    Orv_EngineHandle(const Orv_EngineHandle&) = delete;
+    Orv_EngineHandle& operator=(const Orv_EngineHandle&) = delete;
+    // The engine is going: waits for a Submit() in progress, refuses the rest.
+    void close();
+
+    std::shared_mutex mMutex;
+    Orv_Engine* mEngine; // guarded by mMutex; null once closed
+};
 
 class ZEL_PLATFORM_EXPORT Orv_Engine
 {
 public:
+    // A result whose deliverNext() throws this many times in a row is ended.
+    static constexpr int MaxDeliveryFailuresInARow = 8;
+
     explicit Orv_Engine(unsigned workerCount = 2);
     ~Orv_Engine();
 
     // Queues a request for a worker; an empty pointer is ignored.
     void Submit(boost::shared_ptr<Orv_Request> request);
+    // The handle through which others submit without owning the engine.
+    boost::shared_ptr<Orv_EngineHandle> getHandle() const;
     // The queue that every request and listener of this engine pushes onto.
     boost::shared_ptr<Orv_ResultQ> getResultQ() const;
 
@@ -74,6 +118,7 @@ private:
     std::size_t mFailed = 0;
     bool mStopping = false;
     std::vector<std::thread> mWorkers;
+    boost::shared_ptr<Orv_EngineHandle> mHandle;
 };
 
 #endif

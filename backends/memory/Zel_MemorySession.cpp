@@ -201,14 +201,18 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     , mState(new ZelMemory::SessionState)
 {
     mState->tree = tree ? tree : Zel_MemoryTree::sample();
-    mState->engine = engine;
-    mState->resultQ = engine ? engine->getResultQ() : boost::shared_ptr<Orv_ResultQ>();
+    if (engine) {
+        mState->engine = engine->getHandle();
+        mState->resultQ = engine->getResultQ();
+    }
     mState->applicationName = applicationName;
-    mState->setOwner(this);
+    // This class's rules until the first request is made (a derived session's
+    // own are not reachable yet).
+    mState->setNameRules(illegalAssetNameCharacters(), illegalPropertyNameCharacters());
     setBackendDataSP(mState);
     setRemoteClientStatus(false);
 
-    mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ));
+    mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ, mState));
     mState->tree->data().addObserver(mObserver);
     mPropertyManager = mState->tree->data().propertyManager;
     registerManager(mPropertyManager);
@@ -218,7 +222,6 @@ Zel_MemorySession::~Zel_MemorySession()
 {
     // Requests that outlive the session fail with NotConnected from now on.
     mState->closed = true;
-    mState->setOwner(nullptr);
     mState->tree->data().removeObserver(mObserver.get());
     unregisterManager(mPropertyManager);
 }
@@ -312,8 +315,9 @@ bool Zel_MemorySession::submitRequest(boost::shared_ptr<Orv_Request> request)
 {
     if (!request || !mState->engine || mState->closed.load())
         return false;
-    mState->engine->Submit(request);
-    return true;
+    // False when the engine is gone: the request is not run and its callback
+    // hears nothing.
+    return mState->engine->Submit(std::move(request));
 }
 
 void Zel_MemorySession::cancelAllRequests()
@@ -416,6 +420,9 @@ boost::shared_ptr<Req> Zel_MemorySession::make(const boost::shared_ptr<Callback>
 {
     if (mState->closed.load())
         return boost::shared_ptr<Req>();
+    // The request's work checks names against the rules as they stand now,
+    // taken here on the caller's thread: it never calls into the session.
+    mState->setNameRules(illegalAssetNameCharacters(), illegalPropertyNameCharacters());
     boost::shared_ptr<Concrete> request(new Concrete(callback, mState, args));
     mState->track(request);
     return request;

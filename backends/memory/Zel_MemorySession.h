@@ -19,7 +19,9 @@
 // listeners registered with this session, in the order they were made:
 // created, copied, checked-in, moved-in nodes as child added, deleted and
 // moved-out nodes as child removed, renamed nodes and changes of properties,
-// reservations, locators and media as child updated.
+// reservations, locators and media as child updated. A session hears only of
+// changes under parents its logged-in user may read (judged when the change
+// is reported); before login it hears nothing.
 //
 // The tree's property manager is registered (Zel_Property::setPropertyManagerSP)
 // for the session's life; while several sessions live, the newest one's is.
@@ -33,7 +35,12 @@
 // called from any thread; simulateConnectionLoss, simulateReconnect and close
 // belong to the application's thread (they write the base class's plain
 // connection flag). Name rules: asset names may not contain / \ : * ? " < > |
-// and are at most 128 characters long.
+// and are at most 128 characters long. A derived session may change the
+// illegal characters (illegalAssetNameCharacters, illegalPropertyNameCharacters):
+// each request factory asks for them on the caller's thread, and the request's
+// work checks names against what they answered then; the work never calls
+// into the session, so a session may go while its requests run (those that
+// have not passed their checks yet then fail with NotConnected).
 #ifndef ZEL_MEMORYSESSION_H
 #define ZEL_MEMORYSESSION_H
 
@@ -58,8 +65,10 @@ class ZEL_MEMORY_EXPORT Zel_MemorySession : public Zel_Session
 {
 public:
     // A session on the tree (the bundled sample when tree is empty) whose
-    // requests run on the engine, which must outlive the session's requests;
-    // without an engine submitRequest() answers false and no events are sent.
+    // requests run on the engine. The session may outlive the engine: once
+    // the engine's destruction has begun, submitRequest() answers false (the
+    // request is not run and its callback hears nothing). Without an engine
+    // submitRequest() answers false and no events are sent.
     // applicationName names the application's settings on the server.
     Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tree, Orv_Engine* engine,
                       const QString& applicationName = QStringLiteral("zel"));

@@ -7,7 +7,6 @@
 #include "Zel_EventRes.h"
 #include "Zel_MimeTypeSpec.h"
 #include "Zel_NodeListener.h"
-#include "Zel_Session.h"
 
 namespace ZelMemory {
 
@@ -19,6 +18,27 @@ const unsigned long MediaMask = 0x1981FF;
 boost::shared_ptr<QString> shared(const QString& text)
 {
     return boost::shared_ptr<QString>(new QString(text));
+}
+
+// The session's rule for names, as Zel_Session::isValidName states it: at
+// least one word character (a letter, a digit, a mark or the underscore) and
+// none of the illegal characters.
+bool followsNameRule(const QString& name, const QString& illegalCharacters)
+{
+    bool hasWordCharacter = false;
+    for (const QChar c : name) {
+        if (c.isLetterOrNumber() || c.isMark() || c == QLatin1Char('_')) {
+            hasWordCharacter = true;
+            break;
+        }
+    }
+    if (!hasWordCharacter)
+        return false;
+    for (const QChar c : illegalCharacters) {
+        if (name.contains(c))
+            return false;
+    }
+    return true;
 }
 
 } // namespace
@@ -33,9 +53,11 @@ Cancelable::~Cancelable() = default;
 // --- SessionObserver --------------------------------------------------------
 
 SessionObserver::SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub,
-                                 const boost::shared_ptr<Orv_ResultQ>& resultQ)
+                                 const boost::shared_ptr<Orv_ResultQ>& resultQ,
+                                 const boost::shared_ptr<SessionState>& session)
     : mHub(hub)
     , mResultQ(resultQ)
+    , mSession(session)
     , mNodeListener(new Zel_NodeListener(hub, resultQ))
 {
 }
@@ -44,7 +66,34 @@ SessionObserver::~SessionObserver() = default;
 
 void SessionObserver::treeChanged(const std::vector<Change>& changes)
 {
-    for (const Change& change : changes) {
+    // Which changes the user may hear of: decided under one shared hold of
+    // the tree for the whole batch, which is released before the hub is
+    // called (the tree's lock is never held while waiting for the hub's).
+    const QString user = mSession->user();
+    if (user.isEmpty())
+        return;
+    std::vector<const Change*> readable;
+    readable.reserve(changes.size());
+    {
+        const Tree& tree = mSession->tree->data();
+        ReadHold hold(tree);
+        const User* account = tree.user(user);
+        if (!account)
+            return;
+        const QString* lastParent = nullptr;
+        bool lastReadable = false;
+        for (const Change& change : changes) {
+            if (!lastParent || *lastParent != change.parentMoniker) {
+                const Node* parent = tree.byMoniker(change.parentMoniker);
+                lastReadable = parent ? (tree.permissionsOf(user, *parent) & PermRead) != 0 : account->admin;
+                lastParent = &change.parentMoniker;
+            }
+            if (lastReadable)
+                readable.push_back(&change);
+        }
+    }
+    for (const Change* readableChange : readable) {
+        const Change& change = *readableChange;
         const boost::shared_ptr<QString> parent = shared(change.parentMoniker);
         const boost::shared_ptr<QString> child = shared(change.childMoniker);
         switch (change.kind) {
@@ -102,34 +151,40 @@ QDateTime SessionState::loginTime() const
     return mLoginTime;
 }
 
-void SessionState::setOwner(const Zel_Session* owner)
+void SessionState::setNameRules(const QString& illegalAssetCharacters, const QString& illegalPropertyCharacters)
 {
     std::lock_guard<std::mutex> lock(mMutex);
-    mOwner = owner;
+    mIllegalAssetCharacters = illegalAssetCharacters;
+    mIllegalPropertyCharacters = illegalPropertyCharacters;
+}
+
+void SessionState::requireOpen() const
+{
+    if (closed.load())
+        fail(Zel_MemoryErrorCodes::NotConnected, QStringLiteral("The session is closed."));
 }
 
 bool SessionState::isValidAssetName(const QString& name) const
 {
-    std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner && mOwner->isValidAssetName(name);
+    requireOpen();
+    return followsNameRule(name, illegalAssetCharacters());
 }
 
 bool SessionState::isValidPropertyName(const QString& name) const
 {
-    std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner && mOwner->isValidPropertyName(name);
+    requireOpen();
+    QString illegal;
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        illegal = mIllegalPropertyCharacters;
+    }
+    return followsNameRule(name, illegal);
 }
 
 QString SessionState::illegalAssetCharacters() const
 {
     std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner ? mOwner->illegalAssetNameCharacters() : QString();
-}
-
-bool SessionState::sessionAlive() const
-{
-    std::lock_guard<std::mutex> lock(mMutex);
-    return mOwner != nullptr;
+    return mIllegalAssetCharacters;
 }
 
 void SessionState::track(const boost::shared_ptr<Cancelable>& request)
@@ -166,7 +221,7 @@ Work::Work(SessionState& s, bool needsLogin)
     , tree(s.tree->data())
     , user(s.user())
 {
-    if (session.closed.load() || !session.sessionAlive())
+    if (session.closed.load())
         fail(Zel_MemoryErrorCodes::NotConnected, QStringLiteral("The session is closed."));
     if (!session.connected.load())
         fail(Zel_MemoryErrorCodes::NotConnected,

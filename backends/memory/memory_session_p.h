@@ -31,11 +31,10 @@
 #include <mutex>
 #include <vector>
 
-class Orv_Engine;
+class Orv_EngineHandle;
 class Zel_EventCB;
 class Zel_Node;
 class Zel_NodeListener;
-class Zel_Session;
 
 namespace ZelMemory {
 
@@ -53,19 +52,27 @@ public:
     virtual void cancel() = 0;
 };
 
+class SessionState;
+
 // Hands the tree's changes to one session's listeners: added and removed
 // children through a Zel_NodeListener, updated children as child-updated
 // events under the same rule (only when someone listens for the parent).
+// Only changes under a parent that the session's user may read are passed
+// on (judged when the change is published; a session without a user hears
+// nothing, and a parent that is gone by then counts as unreadable except for
+// an administrator), so events never name nodes the user may not see.
 class SessionObserver : public Observer
 {
 public:
-    SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub, const boost::shared_ptr<Orv_ResultQ>& resultQ);
+    SessionObserver(const boost::shared_ptr<Zel_EventCB>& hub, const boost::shared_ptr<Orv_ResultQ>& resultQ,
+                    const boost::shared_ptr<SessionState>& session);
     ~SessionObserver() override;
     void treeChanged(const std::vector<Change>& changes) override;
 
 private:
     boost::shared_ptr<Zel_EventCB> mHub;
     boost::shared_ptr<Orv_ResultQ> mResultQ;
+    boost::shared_ptr<SessionState> mSession;
     std::unique_ptr<Zel_NodeListener> mNodeListener;
 };
 
@@ -73,7 +80,7 @@ class SessionState
 {
 public:
     boost::shared_ptr<Zel_MemoryTree> tree;
-    Orv_Engine* engine = nullptr;
+    boost::shared_ptr<Orv_EngineHandle> engine; // refuses requests once the engine is gone
     boost::shared_ptr<Orv_ResultQ> resultQ;
     QString applicationName;
     std::atomic<bool> connected{true};
@@ -86,22 +93,29 @@ public:
     QString sessionID() const;
     QDateTime loginTime() const;
 
-    // Name validation through the session (while it lives).
-    void setOwner(const Zel_Session* owner);
+    // Names are checked by the session's rule (Zel_Session::isValidName)
+    // against the illegal characters the session gave when it last made a
+    // request (setNameRules): the work never calls into the session, which
+    // may be going or gone while a request runs. Once the session is closed
+    // the checks throw NotConnected.
+    void setNameRules(const QString& illegalAssetCharacters, const QString& illegalPropertyCharacters);
     bool isValidAssetName(const QString& name) const;
     bool isValidPropertyName(const QString& name) const;
-    bool sessionAlive() const;
     QString illegalAssetCharacters() const;
 
+    // Keeps a weak reference to the request, for cancelAll().
     void track(const boost::shared_ptr<Cancelable>& request);
     void cancelAll();
 
 private:
+    void requireOpen() const;
+
     mutable std::mutex mMutex;
     QString mUser;
     QString mSessionID;
     QDateTime mLoginTime;
-    const Zel_Session* mOwner = nullptr;
+    QString mIllegalAssetCharacters;
+    QString mIllegalPropertyCharacters;
     std::vector<boost::weak_ptr<Cancelable>> mRequests;
 };
 

@@ -2,8 +2,22 @@
 // worker threads: nothing lost, every change heard once, in the order the
 // tree made it. Runs under ThreadSanitizer in CI.
 #include "BackendRecorders.h"
+#include "memory_tree_p.h"
+
+#include "Orv.h"
+#include "Zel_Debug.h"
 
 #include <QSet>
+
+#include <sys/syscall.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <condition_variable>
+#include <fstream>
+#include <shared_mutex>
+#include <string>
+#include <thread>
 
 using namespace Sample;
 
@@ -32,6 +46,48 @@ struct CountingFolderRec : Zel_CreateFolderUniqueCB {
         ++ends;
     }
 };
+
+// A session whose name rule depends on who is logged in: the rule asks the
+// session itself, as a derived session may.
+class UserAwareSession : public Zel_MemorySession
+{
+public:
+    UserAwareSession(const boost::shared_ptr<Zel_MemoryTree>& tree, Orv_Engine* engine)
+        : Zel_MemorySession(tree, engine)
+    {
+    }
+    const QString illegalAssetNameCharacters() const override
+    {
+        // Only an editor may use '#'.
+        const QString base = Zel_MemorySession::illegalAssetNameCharacters();
+        return getUserName() == QLatin1String("editor") ? base : base + QLatin1Char('#');
+    }
+};
+
+// Delivers until done() holds; false when it does not within the guard time
+// (a worker that is stuck never answers).
+template <class Done>
+bool deliverUntil(Orv_Engine& engine, Done done)
+{
+    const auto deadline = std::chrono::steady_clock::now() + std::chrono::seconds(30);
+    while (!done()) {
+        if (std::chrono::steady_clock::now() > deadline)
+            return false;
+        engine.WaitForResults(std::chrono::milliseconds(50));
+        engine.DeliverPending();
+    }
+    return true;
+}
+
+// The scheduling state of a thread of this process ('R' running, 'S' asleep
+// waiting, ...), or 0 when it cannot be read.
+char threadState(long tid)
+{
+    std::ifstream stat("/proc/self/task/" + std::to_string(tid) + "/stat");
+    std::string text((std::istreambuf_iterator<char>(stat)), std::istreambuf_iterator<char>());
+    const std::size_t close = text.rfind(')');
+    return close == std::string::npos || close + 2 >= text.size() ? 0 : text[close + 2];
+}
 
 } // namespace
 
@@ -139,4 +195,110 @@ TEST(Zel_MemorySessionConcurrencyTest, SessionDestroyedWhileItsRequestsRunFailsT
         // Either the whole listing (it ran before the session went) or NotConnected.
         EXPECT_TRUE(answer->ok == 5 || answer->codes == QList<int>{Zel_MemoryErrorCodes::NotConnected}) << answer->log.join(QLatin1Char(',')).toStdString();
     }
+}
+
+TEST(Zel_MemorySessionConcurrencyTest, NameRuleThatAsksTheSessionDoesNotBlockTheWorker)
+{
+    // On the heap: a worker stuck in a name check could not be joined.
+    Orv_Engine* engine = new Orv_Engine(2);
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    boost::shared_ptr<Zel_MemorySession> editor(new UserAwareSession(tree, engine));
+    boost::shared_ptr<Zel_MemorySession> producer(new UserAwareSession(tree, engine));
+    auto login1 = rec<LoginRec>();
+    editor->submitRequest(editor->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login1));
+    auto login2 = rec<LoginRec>();
+    producer->submitRequest(producer->makeLoginReqSP(QStringLiteral("producer"), QStringLiteral("producer"), {}, login2));
+    engine->DeliverAll();
+    ASSERT_EQ(1, login1->ok);
+    ASSERT_EQ(1, login2->ok);
+
+    // Each name through a request of each session, and through the session
+    // itself: the requests judge them exactly as the session does.
+    const QStringList names{QStringLiteral("Rushes #1"), QStringLiteral("a:b"), QStringLiteral("--- !"),
+                            QStringLiteral("_"), QStringLiteral("x\\y"), QString::fromUtf8("\xC3\x9Cn\xC3\xAF" "code"),
+                            QString::fromUtf8("e\xCC\x81"), QString::fromUtf8("\xD9\xA3"),
+                            QString::fromUtf8("\xF0\x9D\x90\x80")};
+    std::vector<boost::shared_ptr<CreateFolderRec>> answers;
+    for (const boost::shared_ptr<Zel_MemorySession>& s : {editor, producer}) {
+        for (const QString& name : names) {
+            answers.push_back(rec<CreateFolderRec>());
+            // Each session in a folder of its own: the same name twice is fine.
+            const QString parent = s == editor ? m(Footage) : m(Highlights);
+            s->submitRequest(s->makeCreateFolderReqSP(mk(parent), name, answers.back()));
+        }
+    }
+    if (!deliverUntil(*engine, [&] {
+            for (const auto& a : answers)
+                if (a->ends != 1)
+                    return false;
+            return true;
+        })) {
+        new boost::shared_ptr<Zel_MemorySession>(editor); // left alive with its stuck worker
+        new boost::shared_ptr<Zel_MemorySession>(producer);
+        FAIL() << "the name check of a request never returned";
+    }
+    for (int i = 0; i < static_cast<int>(answers.size()); ++i) {
+        const boost::shared_ptr<Zel_MemorySession>& s = i < names.size() ? editor : producer;
+        const QString& name = names[i % names.size()];
+        if (s->isValidAssetName(name))
+            EXPECT_EQ(1, answers[i]->ok) << name.toStdString() << " " << answers[i]->messages.join(QLatin1Char(',')).toStdString();
+        else
+            EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidName}, answers[i]->codes) << name.toStdString();
+    }
+    // Only the editor may use '#'.
+    EXPECT_EQ(1, answers[0]->ok);
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidName}, answers[names.size()]->codes);
+    EXPECT_EQ(1, answers[3]->ok);
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidName}, answers[1]->codes);
+    editor.reset();
+    producer.reset();
+    delete engine;
+}
+
+TEST(Zel_MemorySessionConcurrencyTest, RequestRunningWhenItsSessionGoesFailsNotConnected)
+{
+    Orv_Engine engine(1);
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    boost::shared_ptr<Zel_MemorySession> session(new Zel_MemorySession(tree, &engine));
+    auto login = rec<LoginRec>();
+    session->submitRequest(session->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login));
+    engine.DeliverAll();
+    ASSERT_EQ(1, login->ok);
+
+    // The worker's trace line tells which thread runs the request; the test
+    // holds the tree, so the request, past its connection check, waits for it.
+    std::mutex mutex;
+    std::condition_variable started;
+    long worker = 0;
+    const Orv::LogHandler previous = Orv::setLogHandler([&](const char* line) {
+        if (std::string(line).find("Zel_CreateFolderReq: processing request") == std::string::npos)
+            return;
+        std::lock_guard<std::mutex> lock(mutex);
+        worker = static_cast<long>(syscall(SYS_gettid));
+        started.notify_all();
+    });
+    Zel_Debug::instance()->setEnabled(true);
+    std::unique_lock<std::shared_mutex> treeHold(tree->data().mutex);
+
+    auto created = rec<CreateFolderRec>();
+    ASSERT_TRUE(session->submitRequest(session->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Rushes"), created)));
+    bool waiting = false;
+    {
+        std::unique_lock<std::mutex> lock(mutex);
+        if (started.wait_for(lock, std::chrono::seconds(60), [&] { return worker != 0; })) {
+            const auto deadline = std::chrono::steady_clock::now() + std::chrono::seconds(60);
+            while (!(waiting = threadState(worker) == 'S') && std::chrono::steady_clock::now() < deadline)
+                std::this_thread::yield();
+        }
+    }
+    session.reset(); // the session goes while its request is running
+    treeHold.unlock();
+    engine.DeliverAll();
+    Zel_Debug::instance()->setEnabled(false);
+    Orv::setLogHandler(previous);
+
+    EXPECT_TRUE(waiting) << "the request never waited for the tree";
+    EXPECT_EQ((QStringList{QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::NotConnected), QStringLiteral("finished")}),
+              created->log);
+    EXPECT_EQ(0u, engine.failedRequestCount());
 }

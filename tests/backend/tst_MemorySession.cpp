@@ -11,6 +11,8 @@
 
 #include <QDateTime>
 
+#include <memory>
+
 using namespace Sample;
 
 typedef BackendFixture Zel_MemorySessionTest;
@@ -892,4 +894,94 @@ TEST_F(Zel_MemorySessionTest, SettingsBeyondTheLimitsAreRefusedAndStoredSettings
     EXPECT_TRUE(back.contains(QStringLiteral("<a>\n  <b>3</b>\n  <c>2</c>\n </a>\n <d></d>\n"))) << back.toStdString();
     EXPECT_TRUE(back.contains(QStringLiteral("<l64>deep</l64>"))) << back.toStdString();
     EXPECT_FALSE(back.contains(QStringLiteral("TrackHeight")));
+
+TEST_F(Zel_MemorySessionTest, ChangeEventsReachOnlySessionsWhoseUserMayReadTheParent)
+{
+    // The assistant may read the project but not its Archive bin (an empty
+    // entry there); the editor may read it; the admin reads everything.
+    boost::shared_ptr<Zel_MemorySession> admin = newSession(QStringLiteral("admin"));
+    boost::shared_ptr<Zel_MemorySession> assistant = newSession(QStringLiteral("assistant"));
+    FolderRec adminArchive(m(Archive), admin);
+    FolderRec adminAll(QString(), admin);
+    FolderRec editorArchive(m(Archive), session);
+    FolderRec editorAll(QString(), session);
+    FolderRec assistantArchive(m(Archive), assistant);
+    FolderRec assistantAll(QString(), assistant);
+
+    auto vault = rec<CreateFolderRec>();
+    run(admin->makeCreateFolderReqSP(mk(m(Archive)), QStringLiteral("Vault"), vault), admin);
+    ASSERT_EQ(1, vault->nodes.size());
+    const QString v = vault->nodes[0]->getMoniker();
+    auto inner = rec<CreateFolderRec>();
+    run(admin->makeCreateFolderReqSP(mk(v), QStringLiteral("Inner"), inner), admin);
+    ASSERT_EQ(1, inner->nodes.size());
+    const QString i = inner->nodes[0]->getMoniker();
+    auto rushes = rec<CreateFolderRec>();
+    run(admin->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Rushes"), rushes), admin);
+    ASSERT_EQ(1, rushes->nodes.size());
+    const QString r = rushes->nodes[0]->getMoniker();
+    const QString election = QStringLiteral("zel-mem://C-ELECTION");
+    auto renamed = rec<RenameNodeRec>();
+    run(admin->makeRenameNodeReqSP(mk(election), QStringLiteral("Election Night"), renamed), admin);
+    EXPECT_EQ(1, renamed->ok);
+    auto moved = rec<MoveNodeRec>();
+    run(admin->makeMoveNodeReqSP(mk(election), mk(m(Footage)), moved), admin);
+    EXPECT_EQ(1, moved->ok);
+    auto deleted = rec<BoolRec>();
+    run(admin->makeDeleteNodeReqSP(mk(v), deleted), admin);
+    EXPECT_EQ(1, deleted->ok);
+
+    const QStringList everything{QStringLiteral("added ") + v,          QStringLiteral("added ") + i,
+                                 QStringLiteral("added ") + r,          QStringLiteral("updated ") + election,
+                                 QStringLiteral("removed ") + election, QStringLiteral("added ") + election,
+                                 QStringLiteral("removed ") + v};
+    const QStringList inArchive{QStringLiteral("added ") + v, QStringLiteral("updated ") + election,
+                                QStringLiteral("removed ") + election, QStringLiteral("removed ") + v};
+    EXPECT_EQ(everything.join(QLatin1Char(',')).toStdString(), adminAll.events().join(QLatin1Char(',')).toStdString());
+    EXPECT_EQ(inArchive.join(QLatin1Char(',')).toStdString(), adminArchive.events().join(QLatin1Char(',')).toStdString());
+    EXPECT_EQ(everything.join(QLatin1Char(',')).toStdString(), editorAll.events().join(QLatin1Char(',')).toStdString());
+    EXPECT_EQ(inArchive.join(QLatin1Char(',')).toStdString(), editorArchive.events().join(QLatin1Char(',')).toStdString());
+    // Nothing of the bin the assistant may not read, nor of the bin inside
+    // it; the changes under readable parents arrive, in order.
+    EXPECT_EQ((QStringLiteral("added ") + r + QStringLiteral(",added ") + election).toStdString(),
+              assistantAll.events().join(QLatin1Char(',')).toStdString());
+    EXPECT_EQ(std::string(), assistantArchive.events().join(QLatin1Char(',')).toStdString());
+}
+
+// The session may outlive its engine: it then refuses requests, and neither
+// that nor its end touches the engine that is gone.
+TEST(Zel_MemorySessionLifetimeTest, SessionOutlivingItsEngineRefusesRequestsAndEndsCleanly)
+{
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    std::unique_ptr<Orv_Engine> engine(new Orv_Engine(2));
+    boost::shared_ptr<Zel_MemorySession> session(new Zel_MemorySession(tree, engine.get()));
+    auto login = rec<LoginRec>();
+    ASSERT_TRUE(session->submitRequest(session->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login)));
+    engine->DeliverAll();
+    ASSERT_EQ(1, login->ok);
+    std::unique_ptr<FolderRec> footage(new FolderRec(m(Footage), session));
+
+    engine.reset();
+    auto node = rec<NodeRec>();
+    const boost::shared_ptr<Zel_GetNodeReq> request = session->makeGetNodeReqSP(mk(m(Mayor)), node);
+    ASSERT_TRUE(request);
+    EXPECT_FALSE(session->submitRequest(request));
+    EXPECT_FALSE(session->submitRequest(session->makeGetNodeReqSP(mk(m(Mayor)), node)));
+
+    // Another session on the same tree, on an engine of its own, changes the
+    // bin the first one listens to: the report goes nowhere near the old engine.
+    {
+        Orv_Engine other(1);
+        boost::shared_ptr<Zel_MemorySession> producer(new Zel_MemorySession(tree, &other));
+        auto login2 = rec<LoginRec>();
+        producer->submitRequest(producer->makeLoginReqSP(QStringLiteral("producer"), QStringLiteral("producer"), {}, login2));
+        auto created = rec<CreateFolderRec>();
+        producer->submitRequest(producer->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Late"), created));
+        other.DeliverAll();
+        EXPECT_EQ(1, created->ok);
+    }
+    EXPECT_TRUE(footage->events().isEmpty()); // nobody delivers the first session's results any more
+    footage.reset();
+    session.reset();
+    EXPECT_TRUE(node->log.isEmpty()) << node->log.join(QLatin1Char(',')).toStdString();
 }

@@ -10,7 +10,11 @@
 #include <boost/make_shared.hpp>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <atomic>
+#include <climits>
+#include <memory>
+#include <cstdint>
 #include <mutex>
 #include <stdexcept>
 #include <string>
@@ -57,7 +61,57 @@ struct PushingRequest : Orv_Request {
     std::atomic<int> mProcessed{0};
 };
 
+// A result of `count` items whose deliverNext() throws instead of delivering
+// the items listed in `throwsAt` (the item counts as handed out all the same).
+struct ThrowingResult : Orv_Result {
+    ThrowingResult(boost::shared_ptr<LogCB> cb, std::string tag, int count, std::vector<int> throwsAt)
+        : Orv_Result(cb, true), mCB(std::move(cb)), mTag(std::move(tag)), mCount(count), mThrowsAt(std::move(throwsAt)) {}
+    bool deliverNext() override
+    {
+        ++mCalls;
+        if (mNext >= mCount)
+            return false;
+        const int item = mNext++;
+        for (int bad : mThrowsAt)
+            if (bad == item)
+                throw std::runtime_error(mTag + " item " + std::to_string(item));
+        mCB->delivered.push_back(mTag + ":" + std::to_string(item));
+        return mNext < mCount;
+    }
+    boost::shared_ptr<LogCB> mCB;
+    std::string mTag;
+    int mCount;
+    std::vector<int> mThrowsAt;
+    int mNext = 0;
+    int mCalls = 0;
+};
+
+// Every line the engine logs while it lives.
+struct LogLines {
+    LogLines()
+        : mPrevious(Orv::setLogHandler([this](const char* line) {
+            std::lock_guard<std::mutex> lock(mMutex);
+            mLines.push_back(line);
+        }))
+    {
+    }
+    ~LogLines() { Orv::setLogHandler(mPrevious); }
+    std::vector<std::string> lines()
+    {
+        std::lock_guard<std::mutex> lock(mMutex);
+        return mLines;
+    }
+    Orv::LogHandler mPrevious;
+    std::mutex mMutex;
+    std::vector<std::string> mLines;
+};
+
 } // namespace
+
+// The sequence of request identifiers, for tests of its wrap-around.
+struct Orv_RequestIDTestAccess {
+    static std::int32_t restartAt(std::int32_t value) { return Orv_RequestID::restartAt(value); }
+};
 
 TEST(Orv_EngineTest, DeliversEveryItemOfEveryResultInPushOrder)
 {
@@ -200,6 +254,152 @@ TEST(Orv_EngineTest, DestroyingEngineWithQueuedWorkJoinsCleanly)
     EXPECT_LE(processed, 100);
     for (const auto& r : requests)
         EXPECT_LE(r->mProcessed.load(), 1);
+}
+
+TEST(Orv_EngineTest, ResultWhoseDeliveryThrowsIsDeliveredToItsEndAndFinished)
+{
+    LogLines log;
+    Orv_Engine engine(1);
+    auto cb = boost::make_shared<LogCB>();
+    auto throwing = boost::make_shared<ThrowingResult>(cb, "t", 4, std::vector<int>{1, 2});
+    auto afterCB = boost::make_shared<LogCB>();
+    engine.getResultQ()->Push(throwing);
+    engine.getResultQ()->Push(boost::make_shared<CountingResult>(afterCB, "after", 1, true));
+
+    std::size_t delivered = 0;
+    EXPECT_NO_THROW(delivered = engine.DeliverPending());
+    EXPECT_EQ(2u, delivered);
+    // The items after the ones that threw still arrive, and the request ends.
+    EXPECT_EQ((std::vector<std::string>{"t:0", "t:3"}), cb->delivered);
+    EXPECT_TRUE(cb->isFinished());
+    EXPECT_EQ((std::vector<std::string>{"after:0"}), afterCB->delivered);
+    EXPECT_TRUE(afterCB->isFinished());
+    EXPECT_EQ(0u, engine.getResultQ()->Size());
+    EXPECT_EQ((std::vector<std::string>{"orv: delivery of a result failed: t item 1",
+                                        "orv: delivery of a result failed: t item 2"}),
+              log.lines());
+}
+
+TEST(Orv_EngineTest, ResultThatThrowsOnEveryCallIsEndedInsteadOfSpinning)
+{
+    LogLines log;
+    Orv_Engine engine(1);
+    auto cb = boost::make_shared<LogCB>();
+    // A result that never gets past its first item.
+    struct Stuck : Orv_Result {
+        explicit Stuck(boost::shared_ptr<LogCB> cb) : Orv_Result(std::move(cb), true) {}
+        bool deliverNext() override
+        {
+            ++calls;
+            throw 42;
+        }
+        int calls = 0;
+    };
+    auto stuck = boost::make_shared<Stuck>(cb);
+    engine.getResultQ()->Push(stuck);
+    EXPECT_NO_THROW(engine.DeliverAll());
+    EXPECT_EQ(Orv_Engine::MaxDeliveryFailuresInARow, stuck->calls);
+    EXPECT_TRUE(cb->isFinished());
+    const std::vector<std::string> lines = log.lines();
+    ASSERT_EQ(static_cast<std::size_t>(Orv_Engine::MaxDeliveryFailuresInARow), lines.size());
+    EXPECT_EQ("orv: delivery of a result failed: unknown exception", lines.back());
+}
+
+TEST(Orv_EngineTest, HandleRefusesRequestsOnceTheEngineIsGone)
+{
+    auto cb = boost::make_shared<LogCB>();
+    auto before = boost::make_shared<PushingRequest>(cb, "before", 1);
+    boost::shared_ptr<Orv_EngineHandle> handle;
+    {
+        Orv_Engine engine(1);
+        handle = engine.getHandle();
+        EXPECT_TRUE(handle->Submit(before));
+        EXPECT_FALSE(handle->Submit(boost::shared_ptr<Orv_Request>()));
+        engine.DeliverAll();
+    }
+    auto after = boost::make_shared<PushingRequest>(cb, "after", 1);
+    EXPECT_FALSE(handle->Submit(after));
+    EXPECT_EQ(1, before->mProcessed.load());
+    EXPECT_EQ(0, after->mProcessed.load());
+    EXPECT_EQ(1, after.use_count()) << "a refused request is not kept";
+    EXPECT_EQ((std::vector<std::string>{"before/0:0", "before/0:1"}), cb->delivered);
+}
+
+TEST(Orv_EngineTest, HandleSubmittingFromThreadsWhileTheEngineGoesNeverRunsARefusedRequest)
+{
+    for (int round = 0; round < 20; ++round) {
+        auto cb = boost::make_shared<LogCB>();
+        std::unique_ptr<Orv_Engine> engine(new Orv_Engine(2));
+        const boost::shared_ptr<Orv_EngineHandle> handle = engine->getHandle();
+        std::atomic<bool> go(false);
+        std::vector<std::vector<boost::shared_ptr<PushingRequest>>> refused(2);
+        std::vector<std::thread> submitters;
+        for (int t = 0; t < 2; ++t) {
+            submitters.emplace_back([&, t] {
+                while (!go.load())
+                    std::this_thread::yield();
+                for (int i = 0; i < 200; ++i) {
+                    auto request = boost::make_shared<PushingRequest>(cb, "x", 1);
+                    if (!handle->Submit(request))
+                        refused[t].push_back(request);
+                }
+            });
+        }
+        go = true;
+        engine.reset(); // while the submitters run
+        for (std::thread& t : submitters)
+            t.join();
+        EXPECT_FALSE(handle->Submit(boost::make_shared<PushingRequest>(cb, "late", 1)));
+        for (const auto& mine : refused)
+            for (const auto& request : mine)
+                EXPECT_EQ(0, request->mProcessed.load());
+    }
+}
+
+TEST(Orv_EngineTest, RequestIdentifiersWrapPastTheReservedValues)
+{
+    const std::int32_t resume = Orv_RequestIDTestAccess::restartAt(INT32_MAX - 1);
+    std::vector<std::int32_t> values;
+    for (int i = 0; i < 4; ++i)
+        values.push_back(Orv_RequestID::next().getValue());
+    Orv_RequestIDTestAccess::restartAt(resume);
+    // Callback (-2), Invalid (-1) and Session (0) are never a request's; after
+    // the largest value the numbers start again at 1.
+    EXPECT_EQ((std::vector<std::int32_t>{INT32_MAX - 1, INT32_MAX, 1, 2}), values);
+}
+
+TEST(Orv_EngineTest, RequestIdentifiersTakenOnManyThreadsAcrossTheWrapAreDistinctAndPositive)
+{
+    const std::int32_t resume = Orv_RequestIDTestAccess::restartAt(INT32_MAX - 999);
+    const int threads = 4;
+    const int each = 1000;
+    std::vector<std::vector<std::int32_t>> taken(threads);
+    std::vector<std::thread> workers;
+    for (int t = 0; t < threads; ++t) {
+        workers.emplace_back([&, t] {
+            for (int i = 0; i < each; ++i)
+                taken[t].push_back(Orv_RequestID::next().getValue());
+        });
+    }
+    for (std::thread& w : workers)
+        w.join();
+    Orv_RequestIDTestAccess::restartAt(resume);
+
+    std::vector<std::int32_t> all;
+    for (const std::vector<std::int32_t>& mine : taken) {
+        // Each thread sees its numbers in the order of its calls, across the wrap.
+        for (std::size_t i = 1; i < mine.size(); ++i)
+            EXPECT_TRUE(mine[i] > mine[i - 1] || (mine[i - 1] > INT32_MAX - 1000 && mine[i] <= 3000)) << mine[i - 1] << " " << mine[i];
+        all.insert(all.end(), mine.begin(), mine.end());
+    }
+    std::sort(all.begin(), all.end());
+    EXPECT_EQ(all.end(), std::adjacent_find(all.begin(), all.end()));
+    // The 1000 values up to the largest one, then 1 to 3000.
+    ASSERT_EQ(4000u, all.size());
+    EXPECT_EQ(1, all.front());
+    EXPECT_EQ(3000, all[2999]);
+    EXPECT_EQ(INT32_MAX - 999, all[3000]);
+    EXPECT_EQ(INT32_MAX, all.back());
 }
 
 TEST(Threads_MutexTest, IsRecursiveAndExcludesOtherThreads)
