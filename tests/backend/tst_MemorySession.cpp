@@ -894,6 +894,7 @@ TEST_F(Zel_MemorySessionTest, SettingsBeyondTheLimitsAreRefusedAndStoredSettings
     EXPECT_TRUE(back.contains(QStringLiteral("<a>\n  <b>3</b>\n  <c>2</c>\n </a>\n <d></d>\n"))) << back.toStdString();
     EXPECT_TRUE(back.contains(QStringLiteral("<l64>deep</l64>"))) << back.toStdString();
     EXPECT_FALSE(back.contains(QStringLiteral("TrackHeight")));
+}
 
 TEST_F(Zel_MemorySessionTest, ChangeEventsReachOnlySessionsWhoseUserMayReadTheParent)
 {
