@@ -1,8 +1,9 @@
 #!/usr/bin/env bash
 # Builds zel and runs its tests; exits non-zero on any failure.
-# Usage: scripts/test.sh [--qt 6] [--sanitize address,undefined|thread] [--only REGEX]
+# Usage: scripts/test.sh [--qt 6] [--sanitize address,undefined|thread] [--label LABEL] [--only REGEX]
 #   --qt 6        build against Qt 6 instead of Qt 5
 #   --sanitize S  build with the given sanitizers (-fsanitize=S)
+#   --label LABEL run only the tests carrying the ctest label (ctest -L), e.g. threads
 #   --only REGEX  run only the tests whose names match REGEX (ctest -R)
 # Each variant builds in its own folder, build/<variant>.
 set -euo pipefail
@@ -11,11 +12,13 @@ cd "$(dirname "$0")/.."
 qt_major=5
 sanitize=""
 only=""
+label=""
 while [ $# -gt 0 ]; do
   case "$1" in
     --qt) qt_major="$2"; shift 2 ;;
     --sanitize) sanitize="$2"; shift 2 ;;
     --only) only="$2"; shift 2 ;;
+    --label) label="$2"; shift 2 ;;
     *) echo "unknown option: $1" >&2; exit 2 ;;
   esac
 done
@@ -37,4 +40,4 @@ export ASAN_OPTIONS="detect_leaks=1:abort_on_error=1"
 export UBSAN_OPTIONS="print_stacktrace=1:halt_on_error=1"
 export TSAN_OPTIONS="halt_on_error=1 second_deadlock_stack=1 suppressions=$PWD/tests/support/tsan.supp"
 export QT_QPA_PLATFORM=offscreen
-ctest --test-dir "$build" --output-on-failure -j "$jobs" ${only:+-R "$only"}
+ctest --test-dir "$build" --output-on-failure -j "$jobs" ${label:+-L "$label"} ${only:+-R "$only"}

@@ -4,8 +4,6 @@
 #include "Orv_Result.h"
 #include "Orv_ResultQ.h"
 #include "Orv_ResultsCB.h"
-#include "Threads_Mutex.h"
-#include "Threads_MutexTenure.h"
 
 #include <boost/make_shared.hpp>
 #include <gtest/gtest.h>
@@ -400,21 +398,4 @@ TEST(Orv_EngineTest, RequestIdentifiersTakenOnManyThreadsAcrossTheWrapAreDistinc
     EXPECT_EQ(3000, all[2999]);
     EXPECT_EQ(INT32_MAX - 999, all[3000]);
     EXPECT_EQ(INT32_MAX, all.back());
-}
-
-TEST(Threads_MutexTest, IsRecursiveAndExcludesOtherThreads)
-{
-    Threads::Mutex mutex("Test Mutex", false);
-    EXPECT_EQ(mutex.name(), "Test Mutex");
-    std::atomic<bool> otherGotIn(false);
-    {
-        Threads::MutexTenure outer(mutex, nullptr);
-        Threads::MutexTenure inner(mutex, "again"); // same thread: no deadlock
-        std::thread other([&] { otherGotIn = mutex.try_lock(); if (otherGotIn) mutex.unlock(); });
-        other.join();
-    }
-    EXPECT_FALSE(otherGotIn.load());
-    std::thread after([&] { otherGotIn = mutex.try_lock(); if (otherGotIn) mutex.unlock(); });
-    after.join();
-    EXPECT_TRUE(otherGotIn.load());
 }

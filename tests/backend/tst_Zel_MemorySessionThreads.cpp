@@ -91,7 +91,7 @@ char threadState(long tid)
 
 } // namespace
 
-TEST(Zel_MemorySessionConcurrencyTest, ManyRequestsOfTwoSessionsInFlightLoseNothing)
+TEST(Zel_MemorySessionThreadTest, ManyRequestsOfTwoSessionsInFlightLoseNothing)
 {
     Orv_Engine engine(4);
     boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
@@ -174,7 +174,7 @@ TEST(Zel_MemorySessionConcurrencyTest, ManyRequestsOfTwoSessionsInFlightLoseNoth
     EXPECT_EQ(0u, engine.failedRequestCount());
 }
 
-TEST(Zel_MemorySessionConcurrencyTest, SessionDestroyedWhileItsRequestsRunFailsThemCleanly)
+TEST(Zel_MemorySessionThreadTest, SessionDestroyedWhileItsRequestsRunFailsThemCleanly)
 {
     Orv_Engine engine(4);
     boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
@@ -197,7 +197,7 @@ TEST(Zel_MemorySessionConcurrencyTest, SessionDestroyedWhileItsRequestsRunFailsT
     }
 }
 
-TEST(Zel_MemorySessionConcurrencyTest, NameRuleThatAsksTheSessionDoesNotBlockTheWorker)
+TEST(Zel_MemorySessionThreadTest, NameRuleThatAsksTheSessionDoesNotBlockTheWorker)
 {
     // On the heap: a worker stuck in a name check could not be joined.
     Orv_Engine* engine = new Orv_Engine(2);
@@ -255,7 +255,7 @@ TEST(Zel_MemorySessionConcurrencyTest, NameRuleThatAsksTheSessionDoesNotBlockThe
     delete engine;
 }
 
-TEST(Zel_MemorySessionConcurrencyTest, RequestRunningWhenItsSessionGoesFailsNotConnected)
+TEST(Zel_MemorySessionThreadTest, RequestRunningWhenItsSessionGoesFailsNotConnected)
 {
     Orv_Engine engine(1);
     const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
