@@ -37,10 +37,10 @@
 // connection flag). Name rules: asset names may not contain / \ : * ? " < > |
 // and are at most 128 characters long. A derived session may change the
 // illegal characters (illegalAssetNameCharacters, illegalPropertyNameCharacters):
-// each request factory asks for them on the caller's thread, and the request's
-// work checks names against what they answered then; the work never calls
-// into the session, so a session may go while its requests run (those that
-// have not passed their checks yet then fail with NotConnected).
+// every request factory asks for them on its caller's thread, and requests
+// check names against the latest answer. The work never calls into the
+// session, so a session may go while its requests run (those that have not
+// passed their checks yet then fail with NotConnected).
 #ifndef ZEL_MEMORYSESSION_H
 #define ZEL_MEMORYSESSION_H
 
