@@ -12,7 +12,7 @@
 #define ZEL_REQUEST_NAME_Zel_Req(literal) QStringLiteral(literal)
 #define ZEL_REQUEST_NAME_Orv_Request(literal) std::string(literal)
 
-#define ZEL_REQUEST(Stem, Base, Name, Params, Args)                                    \
+#define ZEL_REQUEST(Stem, Base, Name, Params, ArgNames)                                    \
     Zel_##Stem##Req::Zel_##Stem##Req(boost::shared_ptr<Orv_ResultsCB> callback)        \
         : Base(ZEL_REQUEST_NAME_##Base(Name), std::move(callback))                     \
     {                                                                                  \

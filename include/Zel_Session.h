@@ -104,7 +104,7 @@ class Zel_SettingsCB;
 class Zel_StartupCB;
 
 // Requests: one class per line of the catalogue.
-#define ZEL_REQUEST(Stem, Base, Name, Params, Args) class Zel_##Stem##Req;
+#define ZEL_REQUEST(Stem, Base, Name, Params, ArgNames) class Zel_##Stem##Req;
 #include "zel_requests.def"
 #undef ZEL_REQUEST
 
@@ -176,7 +176,7 @@ public:
     // says what each request does; make<Stem>ReqSP makes a Zel_<Stem>Req.
     // Include zel_request_headers.h (or the request's own header, such as
     // Zel_GetNodeReq.h) to hand the request to submitRequest.
-#define ZEL_REQUEST(Stem, Base, Name, Params, Args) \
+#define ZEL_REQUEST(Stem, Base, Name, Params, ArgNames) \
     virtual boost::shared_ptr<Zel_##Stem##Req> make##Stem##ReqSP Params = 0;
 #include "zel_requests.def"
 #undef ZEL_REQUEST

@@ -99,64 +99,11 @@ public:
     virtual boost::shared_ptr<Zel_StatusNotificationCB> getStatusNotificationCBSP() const override;
 
     // --- Request factories --------------------------------------------------
-    virtual boost::shared_ptr<Zel_AddDependencyReq> makeAddDependencyReqSP(MonikerSP moniker, const Zel_DependencySPList& dependencies, boost::shared_ptr<Zel_DependencyCB> callback) override;
-    virtual boost::shared_ptr<Zel_AddFrameLocatorListReq> makeAddFrameLocatorListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& locators, boost::shared_ptr<Zel_FrameLocatorListCB> callback) override;
-    virtual boost::shared_ptr<Zel_AddFrameRestrictionListReq> makeAddFrameRestrictionListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& restrictions, boost::shared_ptr<Zel_FrameRestrictionListCB> callback) override;
-    virtual boost::shared_ptr<Zel_AnalyzeReq> makeAnalyzeReqSP(const QStringList& filePaths, boost::shared_ptr<Zel_AnalyzeCB> callback) override;
-    virtual boost::shared_ptr<Zel_AssociationsReq> makeAssociationsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_AssociationsCB> callback) override;
-    virtual boost::shared_ptr<Zel_CheckinLocalBinReq> makeCheckinLocalBinReqSP(const QString& binFilePath, MonikerSP folderMoniker, boost::shared_ptr<Zel_CheckinCB> callback) override;
-    virtual boost::shared_ptr<Zel_CheckinReq> makeCheckinReqSP(const Zel_MobDescList& mobs, MonikerSP folderMoniker, boost::shared_ptr<Zel_CheckinCB> callback) override;
-    virtual boost::shared_ptr<Zel_CheckinUpdateReq> makeCheckinUpdateReqSP(const Zel_MobDescList& mobs, boost::shared_ptr<Zel_CheckinUpdateCB> callback) override;
-    virtual boost::shared_ptr<Zel_ChildrenAtMonikerReq> makeChildrenAtMonikerReqSP(MonikerSP parentMoniker, boost::shared_ptr<Zel_ChildrenAtMonikerCB> callback) override;
-    virtual boost::shared_ptr<Zel_ChildrenAtReq> makeChildrenAtReqSP(const Zel_Directory& path, boost::shared_ptr<Zel_ChildrenAtCB> callback) override;
-    virtual boost::shared_ptr<Zel_ChildrenReq> makeChildrenReqSP(MonikerSP parentMoniker, boost::shared_ptr<Zel_ChildrenCB> callback) override;
-    virtual boost::shared_ptr<Zel_CopyNodeReq> makeCopyNodeReqSP(MonikerSP moniker, MonikerSP destinationMoniker, boost::shared_ptr<Zel_CopyNodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_CreateFolderReq> makeCreateFolderReqSP(MonikerSP parentMoniker, const QString& name, boost::shared_ptr<Zel_CreateFolderCB> callback) override;
-    virtual boost::shared_ptr<Zel_CreateFolderUniqueReq> makeCreateFolderUniqueReqSP(MonikerSP parentMoniker, const QString& name, boost::shared_ptr<Zel_CreateFolderUniqueCB> callback) override;
-    virtual boost::shared_ptr<Zel_CreateNodeUniqueReq> makeCreateNodeUniqueReqSP(MonikerSP parentMoniker, const QString& name, const Zel_PropertyList& properties, boost::shared_ptr<Zel_ResultCB> callback) override;
-    virtual boost::shared_ptr<Zel_CreatePropertyReq> makeCreatePropertyReqSP(MonikerSP moniker, const Zel_Property& property, boost::shared_ptr<Zel_CreatePropertyCB> callback) override;
-    virtual boost::shared_ptr<Zel_CreateReservationReq> makeCreateReservationReqSP(MonikerSP moniker, const QDateTime& expiry, boost::shared_ptr<Zel_CreateReservationCB> callback) override;
-    virtual boost::shared_ptr<Zel_DeleteFrameLocatorListReq> makeDeleteFrameLocatorListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& locators, boost::shared_ptr<Zel_FrameLocatorListCB> callback) override;
-    virtual boost::shared_ptr<Zel_DeleteFrameRestrictionListReq> makeDeleteFrameRestrictionListReqSP(MonikerSP moniker, const QList<Zel_FrameLocator>& restrictions, boost::shared_ptr<Zel_FrameRestrictionListCB> callback) override;
-    virtual boost::shared_ptr<Zel_DeleteNodeReq> makeDeleteNodeReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultBoolCB> callback) override;
-    virtual boost::shared_ptr<Zel_DeleteReq> makeDeleteReqSP(const QStringList& monikers, bool deleteRemoteMedia, bool deleteLocalMedia, boost::shared_ptr<Zel_DeleteCB> callback) override;
-    virtual boost::shared_ptr<Zel_DirReq> makeDirReqSP(MonikerSP moniker, boost::shared_ptr<Zel_DirCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetApplicationSettingsReq> makeGetApplicationSettingsReqSP(const QString& applicationName, boost::shared_ptr<Zel_GetApplicationSettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetChildrenReq> makeGetChildrenReqSP(MonikerSP parentMoniker, boost::shared_ptr<Zel_ResultCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetFrameLocatorListReq> makeGetFrameLocatorListReqSP(MonikerSP moniker, boost::shared_ptr<Zel_FrameLocatorListCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetFrameRestrictionListReq> makeGetFrameRestrictionListReqSP(MonikerSP moniker, boost::shared_ptr<Zel_FrameRestrictionListCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetLinkedProjectsReq> makeGetLinkedProjectsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetNodeReq> makeGetNodeReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetPropertiesReq> makeGetPropertiesReqSP(MonikerSP moniker, const QStringList& keys, boost::shared_ptr<Zel_PropertyListCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetReservationsReq> makeGetReservationsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_GetReservationsCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetSettingsReq> makeGetSettingsReqSP(const QString& settingsName, boost::shared_ptr<Zel_GetSettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetSyncedProjRootReq> makeGetSyncedProjRootReqSP(MonikerSP moniker, boost::shared_ptr<Zel_ResultCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetUserPriviledgesReq> makeGetUserPriviledgesReqSP(const QString& userName, MonikerSP moniker, boost::shared_ptr<Zel_NodePermissionsCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetUserSettingsReq> makeGetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsType settingsType, boost::shared_ptr<Zel_GetUserSettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_GetWorkgroupSettingsReq> makeGetWorkgroupSettingsReqSP(boost::shared_ptr<Zel_SettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_LoginReq> makeLoginReqSP(const QString& userName, const QString& password, boost::shared_ptr<Zel_LoginCredentials> credentials, boost::shared_ptr<Zel_LoginCB> callback) override;
-    virtual boost::shared_ptr<Zel_MediaResolutionsReq> makeMediaResolutionsReqSP(boost::shared_ptr<Zel_MediaResolutionsCB> callback) override;
-    virtual boost::shared_ptr<Zel_MobBinaryDnDReq> makeMobBinaryDnDReqSP(const Zel_MobIDList& mobs, boost::shared_ptr<Zel_MobBinaryDnDCB> callback) override;
-    virtual boost::shared_ptr<Zel_MobBinaryReq> makeMobBinaryReqSP(boost::shared_ptr<Zel_MobID> mob, boost::shared_ptr<Zel_MobBinaryCB> callback) override;
-    virtual boost::shared_ptr<Zel_MobHeadframeReq> makeMobHeadframeReqSP(boost::shared_ptr<Zel_MobID> mob, boost::shared_ptr<Zel_MobHeadframeCB> callback) override;
-    virtual boost::shared_ptr<Zel_MobNodeReq> makeMobNodeReqSP(boost::shared_ptr<Zel_MobID> mob, boost::shared_ptr<Zel_MobNodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_MonikerReq> makeMonikerReqSP(const Zel_Directory& path, boost::shared_ptr<Zel_MonikerCB> callback) override;
-    virtual boost::shared_ptr<Zel_MoveNodeReq> makeMoveNodeReqSP(MonikerSP moniker, MonikerSP destinationMoniker, boost::shared_ptr<Zel_MoveNodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_NodePermissionsReq> makeNodePermissionsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_NodePermissionsCB> callback) override;
-    virtual boost::shared_ptr<Zel_NodeReq> makeNodeReqSP(const Zel_Directory& path, boost::shared_ptr<Zel_NodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_NodeResolutionsReq> makeNodeResolutionsReqSP(MonikerSP moniker, boost::shared_ptr<Zel_NodeResolutionsCB> callback) override;
-    virtual boost::shared_ptr<Zel_PropertyListReq> makePropertyListReqSP(MonikerSP moniker, boost::shared_ptr<Zel_PropertyListCB> callback) override;
-    virtual boost::shared_ptr<Zel_QueryReq> makeQueryReqSP(boost::shared_ptr<Zel_QuerySpec> query, boost::shared_ptr<Zel_QueryCB> callback) override;
-    virtual boost::shared_ptr<Zel_RefreshNodeReq> makeRefreshNodeReqSP(MonikerSP moniker, boost::shared_ptr<Zel_RefreshNodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_RemoveReservationReq> makeRemoveReservationReqSP(MonikerSP moniker, boost::shared_ptr<Zel_RemoveReservationCB> callback) override;
-    virtual boost::shared_ptr<Zel_RenameNodeReq> makeRenameNodeReqSP(MonikerSP moniker, const QString& newName, boost::shared_ptr<Zel_RenameNodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_RenameUniqueReq> makeRenameUniqueReqSP(MonikerSP moniker, const QString& newName, boost::shared_ptr<Zel_RenameUniqueCB> callback) override;
-    virtual boost::shared_ptr<Zel_RootNodeReq> makeRootNodeReqSP(boost::shared_ptr<Zel_RootNodeCB> callback) override;
-    virtual boost::shared_ptr<Zel_SaveSettingsReq> makeSaveSettingsReqSP(const QString& settingsName, const QString& settingsXml, boost::shared_ptr<Zel_SaveSettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_SetApplicationSettingsReq> makeSetApplicationSettingsReqSP(const QString& applicationName, const QString& settingsXml, boost::shared_ptr<Zel_SetApplicationSettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_SetPropertiesReq> makeSetPropertiesReqSP(MonikerSP moniker, const Zel_PropertyList& properties, boost::shared_ptr<Zel_SetPropertiesCB> callback) override;
-    virtual boost::shared_ptr<Zel_SetUserSettingsReq> makeSetUserSettingsReqSP(Zel_GetUserSettingsCB::UserSettingsType settingsType, const QString& settingsXml, boost::shared_ptr<Zel_SetUserSettingsCB> callback) override;
-    virtual boost::shared_ptr<Zel_StartupReq> makeStartupReqSP(boost::shared_ptr<Zel_StartupCB> callback) override;
+    // One factory per line of zel_requests.def.
+#define ZEL_REQUEST(Stem, Base, Name, Params, ArgNames) \
+    virtual boost::shared_ptr<Zel_##Stem##Req> make##Stem##ReqSP Params override;
+#include "zel_requests.def"
+#undef ZEL_REQUEST
 
     // Asset names may not contain / \\ : * ? " < > |
     virtual const QString illegalAssetNameCharacters() const override;
@@ -178,8 +125,8 @@ private:
     Zel_MemorySession(const Zel_MemorySession&) = delete;
     Zel_MemorySession& operator=(const Zel_MemorySession&) = delete;
 
-    template <class Req, class Concrete, class Callback, class Args>
-    boost::shared_ptr<Req> make(const boost::shared_ptr<Callback>& callback, const Args& args);
+    template <class Req, class Op>
+    boost::shared_ptr<Req> make(const boost::shared_ptr<typename Op::Callback>& callback, typename Op::Args args);
 
     boost::shared_ptr<ZelMemory::SessionState> mState;
     boost::shared_ptr<ZelMemory::SessionObserver> mObserver;

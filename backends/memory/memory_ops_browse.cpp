@@ -262,6 +262,13 @@ void ChildrenAtOp::run(Work& work, const Args& args, Result& result)
 }
 ZEL_MEMORY_EXECUTE(ChildrenAtOp)
 
+void ChildrenAtMonikerOp::prepare(const boost::shared_ptr<Callback>& callback, Args& args)
+{
+    args.callback = callback;
+    if (callback)
+        callback->setParentMoniker(args.moniker);
+}
+
 void ChildrenAtMonikerOp::run(Work& work, const Args& args, Result& result)
 {
     ReadHold hold(work.tree);
@@ -316,6 +323,12 @@ void AssociationsOp::run(Work& work, const Args& args, Result& result)
     }
 }
 ZEL_MEMORY_EXECUTE(AssociationsOp)
+
+void QueryOp::prepare(const boost::shared_ptr<Callback>& callback, Args& args)
+{
+    if (callback)
+        callback->setQuerySpec(args.query);
+}
 
 void QueryOp::run(Work& work, const Args& args, Result& result)
 {

@@ -410,6 +410,12 @@ ZEL_MEMORY_EXECUTE(DeleteOp)
 
 // --- Properties and dependencies ----------------------------------------------------
 
+// A Zel_ConditionalSetPropertiesCB makes the set conditional.
+void SetPropertiesOp::prepare(const boost::shared_ptr<Callback>& callback, Args& args)
+{
+    args.conditional = boost::dynamic_pointer_cast<Zel_ConditionalSetPropertiesCB>(callback) != nullptr;
+}
+
 void SetPropertiesOp::run(Work& work, const Args& args, Result& result)
 {
     WriteHold hold(work.tree);

@@ -28,6 +28,8 @@
 #include <QStringList>
 #include <boost/shared_ptr.hpp>
 
+#include <type_traits>
+
 class Orv_Result;
 class Zel_LoginCredentials;
 
@@ -150,7 +152,7 @@ QList<Zel_FrameLocator> markersOf(const Node& node, bool restrictions);
 // below parent within MaxDepth (memory_ops_change.cpp).
 void requireDepth(Work& work, const Node& parent, int height);
 
-#define ZEL_MEMORY_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                                   \
+#define ZEL_MEMORY_OPERATION_STRUCT(Name, CallbackClass, ResultClass, needsLogin, Extra, ...)                   \
     struct Name {                                                                                                  \
         typedef CallbackClass Callback;                                                                            \
         typedef ResultClass Result;                                                                                \
@@ -161,7 +163,36 @@ void requireDepth(Work& work, const Node& parent, int height);
         static void run(Work& work, const Args& args, Result& result);                                             \
         static boost::shared_ptr<Orv_Result> execute(SessionState& session,                                       \
                                                      const boost::shared_ptr<Callback>& callback, const Args& args); \
+        Extra                                                                                                      \
     };
+
+// An operation: its callback, its result, whether it needs a login, and its
+// arguments, which the request factory fills from its own parameters in order
+// (zel_requests.def); members past those start value-initialised.
+#define ZEL_MEMORY_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                                   \
+    ZEL_MEMORY_OPERATION_STRUCT(Name, CallbackClass, ResultClass, needsLogin, , __VA_ARGS__)
+
+// The same for an operation that also sets up its arguments or callback when
+// its request is made, on the caller's thread (prepare()).
+#define ZEL_MEMORY_PREPARED_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                          \
+    ZEL_MEMORY_OPERATION_STRUCT(Name, CallbackClass, ResultClass, needsLogin,                                     \
+                                static void prepare(const boost::shared_ptr<Callback>& callback, Args& args);,     \
+                                __VA_ARGS__)
+
+template <class Op, class = void>
+struct HasPrepare : std::false_type {
+};
+template <class Op>
+struct HasPrepare<Op, std::void_t<decltype(&Op::prepare)>> : std::true_type {
+};
+
+// Runs the operation's prepare(), where it has one.
+template <class Op>
+void prepareOperation(const boost::shared_ptr<typename Op::Callback>& callback, typename Op::Args& args)
+{
+    if constexpr (HasPrepare<Op>::value)
+        Op::prepare(callback, args);
+}
 
 // Defines execute() in the operation's source file, where its result class is complete.
 #define ZEL_MEMORY_EXECUTE(Name)                                                                                   \
@@ -182,12 +213,14 @@ ZEL_MEMORY_OPERATION(GetChildrenOp, Zel_ResultCB, Zel_GetChildrenRes, true, Moni
 ZEL_MEMORY_OPERATION(ChildrenOp, Zel_ChildrenCB, Zel_ChildrenRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(ChildrenAtOp, Zel_ChildrenAtCB, MemoryRes<Zel_ChildrenAtCB>, true, Zel_Directory path;)
 // The callback is told the parent node (setParentNode) once it is found.
-ZEL_MEMORY_OPERATION(ChildrenAtMonikerOp, Zel_ChildrenAtMonikerCB, MemoryRes<Zel_ChildrenAtMonikerCB>, true,
-                     MonikerSP moniker; boost::shared_ptr<Zel_ChildrenAtMonikerCB> callback;)
+ZEL_MEMORY_PREPARED_OPERATION(ChildrenAtMonikerOp, Zel_ChildrenAtMonikerCB, MemoryRes<Zel_ChildrenAtMonikerCB>,
+                              true, MonikerSP moniker; boost::shared_ptr<Zel_ChildrenAtMonikerCB> callback;)
 ZEL_MEMORY_OPERATION(GetLinkedProjectsOp, Zel_ResultCB, Zel_GetLinkedProjectsRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(GetSyncedProjRootOp, Zel_ResultCB, Zel_GetSyncedProjRootRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(AssociationsOp, Zel_AssociationsCB, Zel_AssociationsRes, true, MonikerSP moniker;)
-ZEL_MEMORY_OPERATION(QueryOp, Zel_QueryCB, MemoryRes<Zel_QueryCB>, true, boost::shared_ptr<Zel_QuerySpec> query;)
+// The callback is told the query specification when the request is made.
+ZEL_MEMORY_PREPARED_OPERATION(QueryOp, Zel_QueryCB, MemoryRes<Zel_QueryCB>, true,
+                              boost::shared_ptr<Zel_QuerySpec> query;)
 
 // --- Properties -----------------------------------------------------------
 ZEL_MEMORY_OPERATION(PropertyListOp, Zel_PropertyListCB, MemoryRes<Zel_PropertyListCB>, true, MonikerSP moniker;)
@@ -196,8 +229,8 @@ ZEL_MEMORY_OPERATION(GetPropertiesOp, Zel_PropertyListCB, MemoryRes<Zel_Property
 // conditional: the callback is a Zel_ConditionalSetPropertiesCB; each
 // property's custom values text then holds the value the application expects
 // the property to have now.
-ZEL_MEMORY_OPERATION(SetPropertiesOp, Zel_SetPropertiesCB, MemoryRes<Zel_SetPropertiesCB>, true, MonikerSP moniker;
-                     Zel_PropertyList properties; bool conditional;)
+ZEL_MEMORY_PREPARED_OPERATION(SetPropertiesOp, Zel_SetPropertiesCB, MemoryRes<Zel_SetPropertiesCB>, true,
+                              MonikerSP moniker; Zel_PropertyList properties; bool conditional;)
 ZEL_MEMORY_OPERATION(CreatePropertyOp, Zel_CreatePropertyCB, MemoryRes<Zel_CreatePropertyCB>, true,
                      MonikerSP moniker; Zel_Property property;)
 ZEL_MEMORY_OPERATION(MediaResolutionsOp, Zel_MediaResolutionsCB, Zel_MediaResolutionsRes, true, int unused;)

@@ -48,7 +48,7 @@ public:
     void setStatusNotificationCB(boost::shared_ptr<Zel_StatusNotificationCB> callback) override {}
     boost::shared_ptr<Zel_StatusNotificationCB> getStatusNotificationCBSP() const override { return boost::shared_ptr<Zel_StatusNotificationCB>(); }
     // Every request factory answers an empty pointer.
-#define ZEL_REQUEST(Stem, Base, Name, Params, Args) \
+#define ZEL_REQUEST(Stem, Base, Name, Params, ArgNames) \
     boost::shared_ptr<Zel_##Stem##Req> make##Stem##ReqSP Params override { return boost::shared_ptr<Zel_##Stem##Req>(); }
 #include "zel_requests.def"
 #undef ZEL_REQUEST
