@@ -32,7 +32,7 @@ bool Zel_MemoryNode::isSyncedBin() const
 
 bool Zel_MemoryNode::isSyncedFolder() const
 {
-    return mSnapshot.syncedProject && Zel_MimeTypeSpec(0x7E00).isType(mSnapshot.mimeType);
+    return mSnapshot.syncedProject && Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(mSnapshot.mimeType);
 }
 
 QString Zel_MemoryNode::getName()

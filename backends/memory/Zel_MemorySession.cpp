@@ -1,4 +1,5 @@
 #include "Zel_MemorySession.h"
+#include "zel_version.h"
 
 #include "memory_ops_p.h"
 #include "memory_session_p.h"
@@ -176,7 +177,7 @@ QString Zel_MemorySession::getServerName() const
 
 QString Zel_MemorySession::getServerVersion() const
 {
-    return QStringLiteral("zel-memory 1.0");
+    return QStringLiteral("zel-memory " ZEL_VERSION_STRING);
 }
 
 QString Zel_MemorySession::getWorkgroupName() const
@@ -240,7 +241,7 @@ QString Zel_MemorySession::getPathSeparator() const
 
 bool Zel_MemorySession::isValidMoniker(const QString& moniker) const
 {
-    if (moniker.startsWith(QLatin1String("zel-mem://")) && moniker.size() > 10)
+    if (moniker.startsWith(ZelMemory::MonikerScheme) && moniker.size() > ZelMemory::MonikerScheme.size())
         return true;
     ZelMemory::Tree& data = mState->tree->data();
     ZelMemory::ReadHold hold(data);

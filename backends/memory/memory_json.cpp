@@ -32,7 +32,6 @@ namespace ZelMemory {
 namespace {
 
 const char* const kFormat = "zel-memory-tree";
-const QString kMonikerPrefix = QStringLiteral("zel-mem://");
 
 struct Failure {
     QString message;
@@ -341,7 +340,7 @@ private:
     {
         for (;;) {
             const QString id = mTree.newNodeId();
-            if (!mExplicitIds.contains(id) && !mExplicitMonikers.contains(kMonikerPrefix + id))
+            if (!mExplicitIds.contains(id) && !mExplicitMonikers.contains(monikerOfId(id)))
                 return id;
         }
     }
@@ -353,7 +352,7 @@ private:
     {
         const QString rootPath = QStringLiteral("root");
         Node& root = readNode(rootObject, rootPath, nullptr);
-        if (!Zel_MimeTypeSpec(0x7E00).isType(root.mimeType))
+        if (!Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(root.mimeType))
             fail(QStringLiteral("root.mimeType"), QStringLiteral("the root must be a container (project, bin, folder, catalog, workspace), not \"%1\"").arg(root.mimeType));
         mTree.rootId = root.id;
 
@@ -401,7 +400,7 @@ private:
             node.id = generatedId();
         if (mTree.byId(node.id))
             fail(dot(path, QStringLiteral("id")), QStringLiteral("a second node with the ID \"%1\"").arg(node.id));
-        node.moniker = optString(o, QStringLiteral("moniker"), path, kMonikerPrefix + node.id);
+        node.moniker = optString(o, QStringLiteral("moniker"), path, monikerOfId(node.id));
         if (node.moniker.isEmpty())
             fail(dot(path, QStringLiteral("moniker")), QStringLiteral("must not be empty"));
         if (mTree.idByMoniker.contains(node.moniker))
@@ -417,7 +416,7 @@ private:
         Zel_MimeTypeValue mimeValue;
         if (!Zel_MimeTypeSpec::getType(node.mimeType, mimeValue))
             fail(dot(path, QStringLiteral("mimeType")), QStringLiteral("unknown mime type \"%1\"").arg(node.mimeType));
-        if (parent && !Zel_MimeTypeSpec(0x7E00).isType(parent->mimeType))
+        if (parent && !Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(parent->mimeType))
             fail(path, QStringLiteral("the parent \"%1\" is a %2, which cannot hold children").arg(parent->name, parent->mimeType));
         node.mobId = optString(o, QStringLiteral("mobID"), path, QString());
         if (!node.mobId.isEmpty()) {
@@ -611,7 +610,7 @@ QJsonObject nodeFieldsToJson(const Node& node)
 {
     QJsonObject o;
     o.insert(QStringLiteral("id"), node.id);
-    if (node.moniker != kMonikerPrefix + node.id)
+    if (node.moniker != monikerOfId(node.id))
         o.insert(QStringLiteral("moniker"), node.moniker);
     o.insert(QStringLiteral("name"), node.name);
     o.insert(QStringLiteral("mimeType"), node.mimeType);

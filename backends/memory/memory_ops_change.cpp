@@ -34,8 +34,6 @@ namespace ZelMemory {
 
 namespace {
 
-const unsigned long ContainerMask = 0x7E00;
-const unsigned long MediaMask = 0x1981FF;
 
 const Node& parentOrFail(Work& work, const Node& node, const QString& action)
 {
@@ -50,12 +48,12 @@ Node newNode(Work& work, const QString& name, const QString& mimeType)
 {
     Node node;
     node.id = work.tree.newNodeId();
-    node.moniker = QStringLiteral("zel-mem://") + node.id;
+    node.moniker = monikerOfId(node.id);
     node.name = name;
     node.mimeType = mimeType;
     node.created = node.modified = QDateTime::currentDateTimeUtc();
     node.properties.append(Property{QStringLiteral("Created By"), work.user, QString()});
-    if (Zel_MimeTypeSpec(MediaMask).isType(mimeType))
+    if (Zel_MimeTypeSpec(Zel_MimeTypes_Media).isType(mimeType))
         node.mobId = work.tree.newMobId();
     return node;
 }
@@ -69,7 +67,7 @@ QString folderTypeFor(const Node& parent)
 // The permission that adding a node of that mime type to a folder needs.
 std::uint32_t addPermissionFor(const QString& mimeType)
 {
-    return Zel_MimeTypeSpec(ContainerMask).isType(mimeType) ? PermAddFolders : PermAddFiles;
+    return Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(mimeType) ? PermAddFolders : PermAddFiles;
 }
 
 Node& createFolder(Work& work, WriteHold& hold, const boost::shared_ptr<QString>& parentMoniker, QString name, bool unique)
@@ -386,7 +384,7 @@ void DeleteOp::run(Work& work, const Args& args, Result& result)
                 if (args.localMedia) {
                     if (!n->media.isEmpty())
                         result.setLocalDeleteMediaSuccessPartialResult(mob, ok());
-                    else if (Zel_MimeTypeSpec(MediaMask).isType(n->mimeType))
+                    else if (Zel_MimeTypeSpec(Zel_MimeTypes_Media).isType(n->mimeType))
                         result.setLocalDeleteMobNotFoundErrorPartialResult(
                             mob, Zel_MemoryError::make(Zel_MemoryErrorCodes::NotFound,
                                                        QStringLiteral("No local media of %1.").arg(work.describe(*n))));

@@ -122,7 +122,7 @@ void CheckinOp::run(Work& work, const Args& args, Result& result)
             name = QStringLiteral("Clip ") + mobID.right(8);
         Node node;
         node.id = work.tree.newNodeId();
-        node.moniker = QStringLiteral("zel-mem://") + node.id;
+        node.moniker = monikerOfId(node.id);
         node.name = work.tree.uniqueChildName(folder, name);
         node.mimeType = QStringLiteral("masterclip");
         node.mobId = mobID;
@@ -153,7 +153,7 @@ void CheckinLocalBinOp::run(Work& work, const Args& args, Result& result)
     // The bin arrives as a new bin of the folder, named after the file.
     Node bin;
     bin.id = work.tree.newNodeId();
-    bin.moniker = QStringLiteral("zel-mem://") + bin.id;
+    bin.moniker = monikerOfId(bin.id);
     bin.name = work.tree.uniqueChildName(folder, name);
     bin.mimeType = QStringLiteral("bin");
     bin.created = bin.modified = QDateTime::currentDateTimeUtc();

@@ -12,8 +12,6 @@ namespace ZelMemory {
 
 namespace {
 
-const unsigned long ContainerMask = 0x7E00; // project, bin, folder, catalog, workspace, playbackdevices
-const unsigned long MediaMask = 0x1981FF;
 
 boost::shared_ptr<QString> shared(const QString& text)
 {
@@ -301,14 +299,14 @@ void Work::requireNotReservedByOther(const Node& n, const QString& action, bool 
 
 void Work::requireFolder(const Node& n)
 {
-    if (!Zel_MimeTypeSpec(ContainerMask).isType(n.mimeType))
+    if (!Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(n.mimeType))
         fail(Zel_MemoryErrorCodes::NotAFolder,
              QStringLiteral("%1 is a %2, not a folder.").arg(describe(n), n.mimeType));
 }
 
 void Work::requireMedia(const Node& n)
 {
-    if (!Zel_MimeTypeSpec(MediaMask).isType(n.mimeType))
+    if (!Zel_MimeTypeSpec(Zel_MimeTypes_Media).isType(n.mimeType))
         fail(Zel_MemoryErrorCodes::NotMedia, QStringLiteral("%1 is a %2, not a media asset.").arg(describe(n), n.mimeType));
 }
 
@@ -357,7 +355,7 @@ boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n)
         }
     }
     s.userPlaced = n.userPlaced;
-    s.dropTarget = Zel_MimeTypeSpec(ContainerMask).isType(n.mimeType)
+    s.dropTarget = Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(n.mimeType)
         && (tree.permissionsOf(user, n) & (PermAddFiles | PermAddFolders)) != 0;
     s.properties = nodeProperties(tree, n);
     return boost::shared_ptr<Zel_Node>(new Zel_MemoryNode(s, session.tree));

@@ -291,7 +291,7 @@ QString Tree::newNodeId()
 {
     for (;;) {
         const QString id = QStringLiteral("N%1").arg(++serial, 6, 10, QLatin1Char('0'));
-        if (!byId(id) && !idByMoniker.contains(QStringLiteral("zel-mem://") + id))
+        if (!byId(id) && !idByMoniker.contains(monikerOfId(id)))
             return id;
     }
 }
@@ -324,7 +324,7 @@ Node& Tree::copySubtree(const Node& source, Node& target, const QString& name)
     auto copyOne = [&](const Node& from, Node& under, const QString& as) -> Node& {
         Node copy = from;
         copy.id = newNodeId();
-        copy.moniker = QStringLiteral("zel-mem://") + copy.id;
+        copy.moniker = monikerOfId(copy.id);
         copy.name = as;
         copy.children.clear();
         copy.childByName.clear();

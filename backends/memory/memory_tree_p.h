@@ -49,6 +49,13 @@ using Zel_MemoryLimits::MaxSettingsKeyLength;
 using Zel_MemoryLimits::MaxSettingsLevels;
 using Zel_MemoryLimits::MaxSettingsSize;
 
+// Monikers of this server: the scheme followed by the node's ID.
+const QLatin1String MonikerScheme("zel-mem://");
+inline QString monikerOfId(const QString& id)
+{
+    return MonikerScheme + id;
+}
+
 // The version of the tree file format that saveTree writes and loadTree reads.
 const int TreeFileVersion = 1;
 

@@ -17,6 +17,8 @@
 
 #include <QString>
 #include <QStringList>
+#include "zel_version.h"
+
 #include <QtGlobal>
 #include <boost/make_shared.hpp>
 
@@ -47,6 +49,7 @@ const char* const kUsage =
     "  --password TEXT      log in with TEXT (default: the user name, as in the sample)\n"
     "  --trace              turn the library's trace log on and print its lines\n"
     "  --write-sample FILE  write the bundled sample tree to FILE, to edit and tour\n"
+    "  --version            print the version of zel the demo was built with\n"
     "  -h, --help           show this help\n"
     "\n"
     "Exit status: 0 when every step got the answers it expected; 1 when one did not\n"
@@ -61,6 +64,7 @@ struct Options {
     bool passwordGiven = false;
     bool trace = false;
     bool help = false;
+    bool version = false;
 };
 
 int usageError(const QString& message)
@@ -82,6 +86,8 @@ QString parse(int argc, char** argv, Options& options)
         };
         if (arg == QLatin1String("-h") || arg == QLatin1String("--help")) {
             options.help = true;
+        } else if (arg == QLatin1String("--version")) {
+            options.version = true;
         } else if (arg == QLatin1String("--trace")) {
             options.trace = true;
         } else if (arg == QLatin1String("--tree")) {
@@ -126,6 +132,10 @@ int main(int argc, char** argv)
         return usageError(error);
     if (options.help) {
         std::fputs(kUsage, stdout);
+        return 0;
+    }
+    if (options.version) {
+        std::printf("zel-demo %s\n", ZEL_VERSION_STRING);
         return 0;
     }
     if (!options.writeSample.isEmpty()) {

@@ -1,6 +1,7 @@
 // End-to-end: every request class through the engine and its worker threads,
 // against the sample tree, with its answers, its failures and its events.
 #include "BackendRecorders.h"
+#include "zel_version.h"
 
 #include "Zel_Dependency.h"
 #include "Zel_DependencySPList.h"
@@ -583,7 +584,9 @@ TEST_F(Zel_MemorySessionTest, ConnectionLossIsAnnouncedAndFailsRequestsUntilReco
 TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
 {
     EXPECT_EQ(QStringLiteral("Newsroom Asset Server (in memory)"), session->getServerName());
-    EXPECT_EQ(QStringLiteral("zel-memory 1.0"), session->getServerVersion());
+    EXPECT_EQ(QStringLiteral("zel-memory 1.0.0"), session->getServerVersion());
+    EXPECT_EQ(QStringLiteral("zel-memory %1.%2.%3").arg(ZEL_VERSION_MAJOR).arg(ZEL_VERSION_MINOR).arg(ZEL_VERSION_PATCH),
+              session->getServerVersion());
     EXPECT_EQ(QStringLiteral("zel-demo"), session->getApplicationName());
     EXPECT_EQ(m(Root), *session->getRootMonikerSP());
     EXPECT_EQ(m(Root), *session->getHomeMonikerSP());
