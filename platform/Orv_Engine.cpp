@@ -200,6 +200,8 @@ void Orv_Engine::runRequest(const boost::shared_ptr<Orv_Request>& request)
     } catch (const std::exception& e) {
         failure = e.what();
     } catch (...) {
+        if (!std::current_exception())
+            throw; // the unwinding that ends the thread goes on
         failure = "unknown exception";
     }
     {
@@ -208,4 +210,12 @@ void Orv_Engine::runRequest(const boost::shared_ptr<Orv_Request>& request)
     }
     const std::string line = "orv: request " + request->name() + " failed: " + failure;
     Orv::log(line.c_str());
+    // The request's own answer for work that did not run tells its callback
+    // that it ended; a request without one leaves its callback unanswered.
+    try {
+        mResultQ->Push(request->makeCanceledResult());
+    } catch (const std::exception& e) {
+        const std::string lost = "orv: request " + request->name() + " could not be answered: " + e.what();
+        Orv::log(lost.c_str());
+    }
 }

@@ -11,6 +11,14 @@
 //     engine.Submit(request);
 //     engine.DeliverAll();               // waits for the work, delivers the answers
 //
+// A request whose process() throws is logged through Orv::log ("orv: request
+// <name> failed: <what>") and counted (failedRequestCount); then its
+// makeCanceledResult() is queued in place of its answers, as for a request
+// cancelled before it ran, so that a request which makes one (a failure and
+// the end notice, say) still tells its callback that it ended. A request
+// that makes none leaves its callback unanswered: backends should answer
+// every failure themselves and not let process() throw.
+//
 // A deliverNext() that throws does not stop delivery: the exception is logged
 // through Orv::log ("orv: delivery of a result failed: <what>") and the engine
 // calls deliverNext() of the same result again, as if it had answered true,

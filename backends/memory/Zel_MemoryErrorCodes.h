@@ -90,7 +90,15 @@ enum Code {
     TooDeep = 1020,
     // Another node has the media object ID given for a new node.
     // CreateNodeUnique.
-    MobIDExists = 1021
+    MobIDExists = 1021,
+    // The server failed in a way no rule foresees (out of memory, a fault of
+    // the backend itself, an exception of the session's fault hook); the
+    // message names what was thrown where it has a text. Any request.
+    Internal = 1022,
+    // The request was cancelled (cancelAllRequests, close, or its callback's
+    // cancelRequest) before it ran; its callback hears this and finished().
+    // Any request.
+    Cancelled = 1023
 };
 
 } // namespace Zel_MemoryErrorCodes

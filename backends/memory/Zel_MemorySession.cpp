@@ -69,6 +69,8 @@
 
 #include "zel_request_headers.h"
 
+#include <boost/make_shared.hpp>
+
 #include <iterator>
 #include <mutex>
 #include <vector>
@@ -353,6 +355,12 @@ void Zel_MemorySession::simulateReconnect()
     }
     if (listener)
         listener->ConnectionReconnected();
+}
+
+void Zel_MemorySession::setFaultHook(std::function<void(const QString& requestName)> hook)
+{
+    mState->setFaultHook(hook ? boost::make_shared<const ZelMemory::FaultHook>(std::move(hook))
+                              : boost::shared_ptr<const ZelMemory::FaultHook>());
 }
 
 // --- Request factories ------------------------------------------------------------

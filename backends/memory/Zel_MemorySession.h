@@ -49,6 +49,7 @@
 
 #include <boost/shared_ptr.hpp>
 
+#include <functional>
 #include <mutex>
 
 class Orv_Engine;
@@ -120,6 +121,15 @@ public:
     // The connection is back: requests run again and the status callback
     // hears connected(). Nothing happens when it is up.
     void simulateReconnect();
+
+    // For testing how an application copes with a failing server: hook is
+    // called on the worker before the work of every request this session
+    // makes, with the request's class name ("Zel_GetNodeReq"), after the
+    // connection and login checks. An exception it throws is answered as any
+    // unforeseen exception of the server is: the callback hears failed()
+    // with Zel_MemoryErrorCodes::Internal (the message names the exception's
+    // text) and then finished(). An empty hook removes it. Thread-safe.
+    void setFaultHook(std::function<void(const QString& requestName)> hook);
 
 private:
     Zel_MemorySession(const Zel_MemorySession&) = delete;

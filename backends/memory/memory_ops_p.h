@@ -160,9 +160,12 @@ void requireDepth(Work& work, const Node& parent, int height);
         struct Args {                                                                                              \
             __VA_ARGS__                                                                                            \
         };                                                                                                         \
+        static constexpr const char* OperationName = #Name;                                                        \
         static void run(Work& work, const Args& args, Result& result);                                             \
         static boost::shared_ptr<Orv_Result> execute(SessionState& session,                                       \
                                                      const boost::shared_ptr<Callback>& callback, const Args& args); \
+        static boost::shared_ptr<Orv_Result> failure(const boost::shared_ptr<Callback>& callback,                 \
+                                                     const boost::shared_ptr<Zel_Error>& error);                   \
         Extra                                                                                                      \
     };
 
@@ -194,12 +197,18 @@ void prepareOperation(const boost::shared_ptr<typename Op::Callback>& callback, 
         Op::prepare(callback, args);
 }
 
-// Defines execute() in the operation's source file, where its result class is complete.
+// Defines execute() and failure() in the operation's source file, where its
+// result class is complete.
 #define ZEL_MEMORY_EXECUTE(Name)                                                                                   \
     boost::shared_ptr<Orv_Result> Name::execute(SessionState& session, const boost::shared_ptr<Callback>& callback, \
                                                 const Args& args)                                                  \
     {                                                                                                              \
         return runOperation<Name>(session, callback, args);                                                        \
+    }                                                                                                              \
+    boost::shared_ptr<Orv_Result> Name::failure(const boost::shared_ptr<Callback>& callback,                       \
+                                                const boost::shared_ptr<Zel_Error>& error)                         \
+    {                                                                                                              \
+        return failureResult<Name>(callback, error);                                                               \
     }
 
 // --- Browsing -------------------------------------------------------------

@@ -46,6 +46,30 @@ void fail(Zel_MemoryErrorCodes::Code code, const QString& message)
     throw Failure{Zel_MemoryError::make(code, message)};
 }
 
+boost::shared_ptr<Zel_Error> internalError(const char* what)
+{
+    QString message = QStringLiteral("The server failed");
+    if (what && *what)
+        message += QStringLiteral(": ") + QString::fromUtf8(what);
+    return Zel_MemoryError::make(Zel_MemoryErrorCodes::Internal, message + QLatin1Char('.'));
+}
+
+boost::shared_ptr<Zel_Error> cancelledError()
+{
+    return Zel_MemoryError::make(Zel_MemoryErrorCodes::Cancelled, QStringLiteral("The request was cancelled before it ran."));
+}
+
+void runFaultHook(const SessionState& session, const char* operationName)
+{
+    const boost::shared_ptr<const FaultHook> hook = session.faultHook();
+    if (!hook || !*hook)
+        return;
+    // "GetNodeOp" answers the request class Zel_GetNodeReq.
+    QString name = QString::fromLatin1(operationName);
+    name.chop(2);
+    (*hook)(QStringLiteral("Zel_") + name + QStringLiteral("Req"));
+}
+
 Cancelable::~Cancelable() = default;
 
 // --- SessionObserver --------------------------------------------------------
@@ -183,6 +207,16 @@ QString SessionState::illegalAssetCharacters() const
 {
     std::lock_guard<std::mutex> lock(mMutex);
     return mIllegalAssetCharacters;
+}
+
+boost::shared_ptr<const FaultHook> SessionState::faultHook() const
+{
+    return boost::atomic_load(&mFaultHook);
+}
+
+void SessionState::setFaultHook(const boost::shared_ptr<const FaultHook>& hook)
+{
+    boost::atomic_store(&mFaultHook, hook);
 }
 
 void SessionState::track(const boost::shared_ptr<Cancelable>& request)

@@ -6,9 +6,13 @@
 // one request's work: it checks the connection and the login once, and offers
 // the lookups and checks every operation needs, each of which throws a
 // Failure carrying the error record. runOperation() builds the operation's
-// result, runs the operation and, when it throws, replaces whatever was
-// collected by a fresh result holding only the failure. Operations validate
-// everything before they change the tree, so a failure leaves it unchanged.
+// result, runs the operation and, when it throws anything, replaces whatever
+// was collected by a fresh result holding only the failure: a Failure's own
+// record, Internal for every other exception. Operations validate everything
+// before they change the tree, so a failure leaves it unchanged. A request
+// that is cancelled, or whose work could not even answer, still answers with
+// a failure and the end notice (makeCanceledResult), so that no callback
+// waits for ever.
 #ifndef MEMORY_SESSION_P_H
 #define MEMORY_SESSION_P_H
 
@@ -27,6 +31,8 @@
 #include <boost/weak_ptr.hpp>
 
 #include <atomic>
+#include <exception>
+#include <functional>
 #include <memory>
 #include <mutex>
 #include <vector>
@@ -43,6 +49,16 @@ struct Failure {
 };
 
 [[noreturn]] void fail(Zel_MemoryErrorCodes::Code code, const QString& message);
+
+// The record of an exception no rule foresees: Internal, naming what (when
+// there is a text).
+boost::shared_ptr<Zel_Error> internalError(const char* what);
+// The record of a request cancelled before it ran.
+boost::shared_ptr<Zel_Error> cancelledError();
+
+// Called before each request's work with the request's class name; what it
+// throws is answered like an exception of the work (Zel_MemorySession::setFaultHook).
+typedef std::function<void(const QString& requestName)> FaultHook;
 
 // A request that can be cancelled by its session.
 class Cancelable
@@ -103,6 +119,10 @@ public:
     bool isValidPropertyName(const QString& name) const;
     QString illegalAssetCharacters() const;
 
+    // The session's fault hook, if any (read on the workers, set by the application).
+    boost::shared_ptr<const FaultHook> faultHook() const;
+    void setFaultHook(const boost::shared_ptr<const FaultHook>& hook);
+
     // Keeps a weak reference to the request, for cancelAll().
     void track(const boost::shared_ptr<Cancelable>& request);
     void cancelAll();
@@ -117,6 +137,7 @@ private:
     QString mIllegalAssetCharacters;
     QString mIllegalPropertyCharacters;
     std::vector<boost::weak_ptr<Cancelable>> mRequests;
+    boost::shared_ptr<const FaultHook> mFaultHook; // boost::atomic_load / atomic_store
 };
 
 // The context of one request's work.
@@ -147,21 +168,44 @@ public:
     boost::shared_ptr<Zel_Node> snapshot(const Node& node);
 };
 
-// Runs an operation into a new final result of its result class.
+// A final result of the operation's result class holding only the failure.
+template <class Op>
+boost::shared_ptr<Orv_Result> failureResult(const boost::shared_ptr<typename Op::Callback>& callback,
+                                            const boost::shared_ptr<Zel_Error>& error)
+{
+    boost::shared_ptr<typename Op::Result> result(new typename Op::Result(callback, true));
+    failInto(*result, error);
+    return result;
+}
+
+// Runs the session's fault hook, if it has one, for the operation's request.
+void runFaultHook(const SessionState& session, const char* operationName);
+
+// Runs an operation into a new final result of its result class. Every
+// exception becomes a failure answer; only the unwinding that ends a thread
+// (which carries no C++ exception object) goes on.
 template <class Op>
 boost::shared_ptr<Orv_Result> runOperation(SessionState& session, const boost::shared_ptr<typename Op::Callback>& callback,
                                            const typename Op::Args& args)
 {
     typedef typename Op::Result Result;
-    boost::shared_ptr<Result> result(new Result(callback, true));
+    boost::shared_ptr<Zel_Error> error;
     try {
+        boost::shared_ptr<Result> result(new Result(callback, true));
         Work work(session, Op::NeedsLogin);
+        runFaultHook(session, Op::OperationName);
         Op::run(work, args, *result);
+        return result;
     } catch (const Failure& failure) {
-        result.reset(new Result(callback, true));
-        failInto(*result, failure.error);
+        error = failure.error;
+    } catch (const std::exception& e) {
+        error = internalError(e.what());
+    } catch (...) {
+        if (!std::current_exception())
+            throw;
+        error = internalError(nullptr);
     }
-    return result;
+    return failureResult<Op>(callback, error);
 }
 
 // A concrete request of the request class Base, doing Op's work.
@@ -184,6 +228,13 @@ public:
         return true;
     }
     void cancel() override { this->setCanceled(true); }
+
+protected:
+    // The engine's answer for a request it did not run, or whose process() threw.
+    boost::shared_ptr<Orv_Result> makeCanceledResult() override
+    {
+        return Op::failure(mCallback, this->isCanceled() ? cancelledError() : internalError(nullptr));
+    }
 
 private:
     boost::shared_ptr<typename Op::Callback> mCallback;
@@ -216,6 +267,12 @@ public:
         return true;
     }
     void cancel() override { this->setCanceled(true); }
+
+protected:
+    boost::shared_ptr<Orv_Result> makeCanceledResult() override
+    {
+        return Op::failure(mCallback, this->isCanceled() ? cancelledError() : internalError(nullptr));
+    }
 
 private:
     boost::shared_ptr<typename Op::Callback> mCallback;

@@ -12,7 +12,12 @@
 
 #include <QDateTime>
 
+#include <functional>
 #include <memory>
+#include <new>
+#include <stdexcept>
+#include <utility>
+#include <vector>
 
 using namespace Sample;
 
@@ -604,12 +609,15 @@ TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
     EXPECT_FALSE(session->isValidAssetName(QStringLiteral("a:b")));
     EXPECT_TRUE(session->isValidAssetName(QStringLiteral("Rushes 2")));
 
-    // A request made but not yet run is cancelled with the rest.
+    // A request made but not yet run is cancelled with the rest: it is not
+    // run, and its callback hears that it was cancelled, and its end.
     auto cancelled = rec<NodeRec>();
     boost::shared_ptr<Zel_GetNodeReq> pending = session->makeGetNodeReqSP(mk(m(Mayor)), cancelled);
     session->cancelAllRequests();
     run(pending);
-    EXPECT_TRUE(cancelled->log.isEmpty());
+    EXPECT_EQ((QStringList{QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::Cancelled), QStringLiteral("finished")}),
+              cancelled->log);
+    EXPECT_EQ(QStringLiteral("The request was cancelled before it ran."), cancelled->messages.value(0));
 
     session->close();
     EXPECT_FALSE(session->isLoggedIn());
@@ -988,4 +996,56 @@ TEST(Zel_MemorySessionLifetimeTest, SessionOutlivingItsEngineRefusesRequestsAndE
     footage.reset();
     session.reset();
     EXPECT_TRUE(node->log.isEmpty()) << node->log.join(QLatin1Char(',')).toStdString();
+}
+
+TEST_F(Zel_MemorySessionTest, EveryExceptionOfTheWorkIsAnsweredWithOneFailureAndTheEnd)
+{
+    // Whatever the server's work throws, the callback hears exactly one
+    // failure (Internal, naming the exception where it has a text) and then
+    // finished(), through the engine; the tree is unchanged and later
+    // requests run normally.
+    struct NotAStdException {
+    };
+    const std::vector<std::pair<std::function<void()>, QString>> throwers = {
+        {[] { throw std::bad_alloc(); }, QStringLiteral("The server failed: std::bad_alloc.")},
+        {[] { throw std::runtime_error("disk on fire"); }, QStringLiteral("The server failed: disk on fire.")},
+        {[] { throw std::out_of_range(""); }, QStringLiteral("The server failed.")},
+        {[] { throw 42; }, QStringLiteral("The server failed.")},
+        {[] { throw NotAStdException(); }, QStringLiteral("The server failed.")},
+    };
+    QStringList asked;
+    for (const auto& thrower : throwers) {
+        session->setFaultHook([&asked, &thrower](const QString& requestName) {
+            asked << requestName;
+            thrower.first();
+        });
+        auto get = rec<NodeRec>();
+        run(session->makeGetNodeReqSP(mk(m(Mayor)), get));
+        EXPECT_EQ((QStringList{QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::Internal), QStringLiteral("finished")}),
+                  get->log);
+        EXPECT_EQ(thrower.second, get->messages.value(0));
+
+        // A change that fails this way changes nothing.
+        auto rename = rec<RenameNodeRec>();
+        run(session->makeRenameNodeReqSP(mk(m(Mayor)), QStringLiteral("Renamed"), rename));
+        EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::Internal}, rename->codes);
+        EXPECT_EQ(1, rename->ends);
+    }
+    EXPECT_EQ(QStringLiteral("Zel_GetNodeReq"), asked.value(0));
+    EXPECT_EQ(QStringLiteral("Zel_RenameNodeReq"), asked.value(1));
+    EXPECT_EQ(10, asked.size());
+
+    // The three requests on Orv_Request go the same way (the root node's
+    // callback has no end notice).
+    session->setFaultHook([](const QString&) { throw std::runtime_error("no root today"); });
+    auto root = rec<RootNodeRec>();
+    run(session->makeRootNodeReqSP(root));
+    EXPECT_EQ(QStringList{QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::Internal)}, root->log);
+    EXPECT_EQ(QStringLiteral("The server failed: no root today."), root->messages.value(0));
+
+    session->setFaultHook(nullptr);
+    auto get = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Mayor)), get));
+    EXPECT_EQ((QStringList{QStringLiteral("ok Interview Mayor"), QStringLiteral("finished")}), get->log);
+    EXPECT_EQ(0u, engine.failedRequestCount());
 }

@@ -212,6 +212,62 @@ TEST(Orv_EngineTest, ThrowingRequestIsLoggedAndCounted)
     EXPECT_EQ(lines[0], "orv: request Thrower failed: boom");
 }
 
+TEST(Orv_EngineTest, ThrowingRequestIsAnsweredByItsCanceledResultWhereItMakesOne)
+{
+    // A request whose process() throws, with or without an answer of its own
+    // for work that did not run; and one that throws something that is no
+    // std::exception. The one with an answer gets it delivered in place of
+    // its work's, the others leave their callbacks unanswered; every one is
+    // logged and counted, and requests after them run as usual.
+    struct Thrower : Orv_Request {
+        Thrower(boost::shared_ptr<LogCB> cb, bool answers, bool stdException)
+            : Orv_Request("Thrower", cb), mCB(std::move(cb)), mAnswers(answers), mStd(stdException) {}
+        bool process(boost::shared_ptr<Orv_ResultQ>) override
+        {
+            if (mStd)
+                throw std::runtime_error("boom");
+            throw 7;
+        }
+        boost::shared_ptr<Orv_Result> makeCanceledResult() override
+        {
+            if (!mAnswers)
+                return boost::shared_ptr<Orv_Result>();
+            return boost::make_shared<CountingResult>(mCB, "failed", 1, true);
+        }
+        boost::shared_ptr<LogCB> mCB;
+        bool mAnswers;
+        bool mStd;
+    };
+    std::vector<std::string> lines;
+    std::mutex linesMutex;
+    const Orv::LogHandler previous = Orv::setLogHandler([&](const char* line) {
+        std::lock_guard<std::mutex> lock(linesMutex);
+        lines.push_back(line);
+    });
+    const auto answered = boost::make_shared<LogCB>();
+    const auto silent = boost::make_shared<LogCB>();
+    const auto foreign = boost::make_shared<LogCB>();
+    const auto after = boost::make_shared<LogCB>();
+    {
+        Orv_Engine engine(1);
+        engine.Submit(boost::make_shared<Thrower>(answered, true, true));
+        engine.Submit(boost::make_shared<Thrower>(silent, false, true));
+        engine.Submit(boost::make_shared<Thrower>(foreign, true, false));
+        engine.Submit(boost::make_shared<PushingRequest>(after, "after", 1));
+        engine.DeliverAll();
+        EXPECT_EQ(engine.failedRequestCount(), 3u);
+    }
+    Orv::setLogHandler(previous);
+    EXPECT_EQ(answered->delivered, std::vector<std::string>{"failed:0"});
+    EXPECT_TRUE(answered->isFinished());
+    EXPECT_TRUE(silent->delivered.empty());
+    EXPECT_FALSE(silent->isFinished());
+    EXPECT_EQ(foreign->delivered, std::vector<std::string>{"failed:0"});
+    EXPECT_EQ(after->delivered, (std::vector<std::string>{"after/0:0", "after/0:1"}));
+    EXPECT_EQ(lines, (std::vector<std::string>{"orv: request Thrower failed: boom", "orv: request Thrower failed: boom",
+                                               "orv: request Thrower failed: unknown exception"}));
+}
+
 TEST(Orv_EngineTest, LogWithoutHandlerDiscardsAndHandlerCanBeReplaced)
 {
     const Orv::LogHandler previous = Orv::setLogHandler(Orv::LogHandler());
