@@ -11,6 +11,14 @@
 //     feature                        ns/item   baseline                 ns/item   ratio
 //     delivery/GetNodeRes/.../1000      9.1   delivery/.../floor/1000      6.3   1.44x floor
 //
+// A comparison may carry a target, the largest ratio that is acceptable
+// (target()); its line then ends in PASS or FAIL, and a last line per program
+// counts them ("targets met: N of M"), and scripts/bench.sh lists them all.
+// A target compares time per item by default, or whole iterations (a growth
+// target, such as "ten times the settings cost at most twelve times the
+// time"), and may measure the feature against a peer the other way round
+// (peer / feature >= 1 is feature / peer <= 1).
+//
 // Times are CPU time per item (single-threaded rows; CPU time is less
 // disturbed than wall time when the machine is shared). With
 // --benchmark_repetitions=N the table uses the median of the repetitions.
@@ -24,6 +32,7 @@
 #include <algorithm>
 #include <cstdint>
 #include <cstdio>
+#include <cstdlib>
 #include <unistd.h>
 #include <map>
 #include <string>
@@ -36,8 +45,25 @@ struct Comparison
 {
     std::string feature;
     std::string baseline;
-    std::string kind; // "floor" or "peer"
+    std::string kind;      // "floor", "peer" or "growth"
+    double maxRatio = 0;   // 0: no target
+    bool perItem = true;   // ratio of times per item, or per iteration
+    std::string target;    // the target's name in the summary
 };
+
+// True for a smoke run (scripts/bench.sh --smoke, ZEL_BENCH_SMOKE=1): rows use
+// small sizes, so that every program is seen to build and run in seconds.
+inline bool smoke()
+{
+    const char* value = std::getenv("ZEL_BENCH_SMOKE");
+    return value && *value && std::string(value) != "0";
+}
+
+// n normally, small in a smoke run.
+inline int size(int n, int smokeSize)
+{
+    return smoke() ? smokeSize : n;
+}
 
 inline std::map<std::string, double>& itemsPerIteration()
 {
@@ -67,7 +93,15 @@ benchmark::internal::Benchmark* row(const std::string& name, double items, Fn fn
 // Pairs a measured row with its baseline row; kind is "floor" or "peer".
 inline void compare(const std::string& feature, const std::string& baseline, const char* kind)
 {
-    comparisons().push_back(Comparison{feature, baseline, kind});
+    comparisons().push_back(Comparison{feature, baseline, kind, 0, true, std::string()});
+}
+
+// The same with a target: the ratio (time per item, or per iteration when
+// perItem is false) may be at most maxRatio. name labels it in the summary.
+inline void target(const std::string& name, const std::string& feature, const std::string& baseline, const char* kind,
+                   double maxRatio, bool perItem = true)
+{
+    comparisons().push_back(Comparison{feature, baseline, kind, maxRatio, perItem, name});
 }
 
 // Console output as usual, and the CPU time per iteration of every row kept
@@ -135,29 +169,43 @@ inline void printTable(const char* title, const CollectingReporter& reporter)
         featureWidth = std::max(featureWidth, comparison.feature.size());
         baselineWidth = std::max(baselineWidth, comparison.baseline.size());
     }
-    std::printf("\n== %s: CPU time per item; ratio = feature / baseline\n", title);
-    std::printf("%-*s %12s   %-*s %12s %9s\n", static_cast<int>(featureWidth), "feature", "time/item",
-                static_cast<int>(baselineWidth), "baseline", "time/item", "ratio");
+    std::printf("\n== %s: CPU time per item (per iteration for growth); ratio = feature / baseline\n", title);
+    std::printf("%-*s %12s   %-*s %12s %9s\n", static_cast<int>(featureWidth), "feature", "time",
+                static_cast<int>(baselineWidth), "baseline", "time", "ratio");
     int printed = 0;
+    int passed = 0;
+    int failed = 0;
     for (const Comparison& comparison : comparisons()) {
         const double feature = reporter.secondsPerIteration(comparison.feature);
         const double baseline = reporter.secondsPerIteration(comparison.baseline);
         if (feature < 0 || baseline <= 0)
             continue; // filtered out
-        const double featureItems = itemsPerIteration()[comparison.feature];
-        const double baselineItems = itemsPerIteration()[comparison.baseline];
-        // Compare per item, so rows may run different batch sizes.
-        const double featurePerItem = feature * 1e9 / featureItems;
-        const double baselinePerItem = baseline * 1e9 / baselineItems;
-        std::printf("%-*s %12s   %-*s %12s %8.2fx %s\n", static_cast<int>(featureWidth),
-                    comparison.feature.c_str(), formatTime(featurePerItem).c_str(),
-                    static_cast<int>(baselineWidth), comparison.baseline.c_str(),
-                    formatTime(baselinePerItem).c_str(), featurePerItem / baselinePerItem,
-                    comparison.kind.c_str());
+        // Per item, so rows may run different batch sizes; per iteration for
+        // growth targets, which compare whole jobs of different sizes.
+        const double featureItems = comparison.perItem ? itemsPerIteration()[comparison.feature] : 1.0;
+        const double baselineItems = comparison.perItem ? itemsPerIteration()[comparison.baseline] : 1.0;
+        const double featureTime = feature * 1e9 / featureItems;
+        const double baselineTime = baseline * 1e9 / baselineItems;
+        const double ratio = featureTime / baselineTime;
+        std::string verdict;
+        if (comparison.maxRatio > 0) {
+            const bool pass = ratio <= comparison.maxRatio;
+            char text[160];
+            std::snprintf(text, sizeof text, "  target <= %.2fx: %s (%s)", comparison.maxRatio, pass ? "PASS" : "FAIL",
+                          comparison.target.c_str());
+            verdict = text;
+            ++(pass ? passed : failed);
+        }
+        std::printf("%-*s %12s   %-*s %12s %8.2fx %s%s\n", static_cast<int>(featureWidth),
+                    comparison.feature.c_str(), formatTime(featureTime).c_str(), static_cast<int>(baselineWidth),
+                    comparison.baseline.c_str(), formatTime(baselineTime).c_str(), ratio, comparison.kind.c_str(),
+                    verdict.c_str());
         ++printed;
     }
     if (printed == 0)
         std::printf("(no pair of rows ran)\n");
+    if (passed + failed > 0)
+        std::printf("targets met: %d of %d\n", passed, passed + failed);
     std::fflush(stdout);
 }
 
