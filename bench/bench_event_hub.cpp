@@ -1,7 +1,7 @@
 // Event hub: Zel_EventRes::deliverNext through a session's Zel_EventCB, against
 // the floor of calling the same listeners' handleEvent straight from a vector,
 // against boost::signals2 (the peer an application would otherwise use for
-// fan-out), and Zel_EventCB::hasRegisteredListener against plain QMap lookups.
+// fan-out), and Zel_EventCB::hasRegisteredListener against plain QHash lookups.
 //
 // The hub holds a realistic table: the listeners of the event's folder (1, 10
 // or 100), two listeners for every node (filed under ""), and 50 other folders
@@ -12,8 +12,8 @@
 //   hub/floor/L+2                      for (listener : listeners) listener->handleEvent(event)
 //   hub/hasRegisteredListener/<case>   filed: the folder has listeners; unfiled: only the
 //                                      "" listeners answer; none: a hub without "" listeners
-//   hub/QMap-lookups/<case>            the same contains() calls on an unlocked QMap (floor)
-//   hub/locked-QMap-lookups/<case>     the same under a std::recursive_mutex (peer)
+//   hub/QHash-lookups/<case>           the same contains() calls on an unlocked QHash (floor)
+//   hub/locked-QHash-lookups/<case>    the same under a std::recursive_mutex (peer)
 //
 // Fan-out: one child-added event delivered through a Zel_EventRes to K folder
 // facades (Zel_IEventListenerFolder, counting their childAdded calls) filed
@@ -34,7 +34,7 @@
 #include "Zel_EventRes.h"
 #include "Zel_IEventListenerFolder.h"
 
-#include <QMap>
+#include <QHash>
 #include <QString>
 #include <boost/make_shared.hpp>
 #include <boost/shared_ptr.hpp>
@@ -166,10 +166,10 @@ void registerDeliveryRows(int folderListeners)
     zelbench::compare(feature, floor, "floor");
 }
 
-// The keys of the fixture's table, for the plain QMap baselines.
-QMap<QString, int> plainTable(bool everyNodeListeners)
+// The keys of the fixture's table, for the plain QHash baselines (the hub's table is a QHash).
+QHash<QString, int> plainTable(bool everyNodeListeners)
 {
-    QMap<QString, int> table;
+    QHash<QString, int> table;
     for (int i = 0; i < kOtherFolders; ++i)
         table.insert(*otherMoniker(i), 1);
     table.insert(*folderMoniker(), 1);
@@ -181,8 +181,8 @@ QMap<QString, int> plainTable(bool everyNodeListeners)
 void registerQueryRows(const char* name, bool askForFolder, bool everyNodeListeners, bool expected)
 {
     const std::string feature = std::string("hub/hasRegisteredListener/") + name;
-    const std::string floor = std::string("hub/QMap-lookups/") + name;
-    const std::string peer = std::string("hub/locked-QMap-lookups/") + name;
+    const std::string floor = std::string("hub/QHash-lookups/") + name;
+    const std::string peer = std::string("hub/locked-QHash-lookups/") + name;
     auto asked = [askForFolder]() { return askForFolder ? folderMoniker() : otherMoniker(kOtherFolders + 7); };
 
     zelbench::row(feature, 1, [=](benchmark::State& state) {
@@ -196,7 +196,7 @@ void registerQueryRows(const char* name, bool askForFolder, bool everyNodeListen
         }
     });
     zelbench::row(floor, 1, [=](benchmark::State& state) {
-        const QMap<QString, int> table = plainTable(everyNodeListeners);
+        const QHash<QString, int> table = plainTable(everyNodeListeners);
         const boost::shared_ptr<QString> moniker = asked();
         check((table.contains(*moniker) || table.contains(QString())) == expected, "the floor gave the wrong answer");
         for (auto _ : state) {
@@ -205,7 +205,7 @@ void registerQueryRows(const char* name, bool askForFolder, bool everyNodeListen
         }
     });
     zelbench::row(peer, 1, [=](benchmark::State& state) {
-        const QMap<QString, int> table = plainTable(everyNodeListeners);
+        const QHash<QString, int> table = plainTable(everyNodeListeners);
         const boost::shared_ptr<QString> moniker = asked();
         std::recursive_mutex mutex;
         for (auto _ : state) {
