@@ -71,9 +71,10 @@ void Zel_EventCB::UnregisterAll()
 
 bool Zel_EventCB::hasRegisteredListener(boost::shared_ptr<QString> moniker)
 {
-    const QString key = getMonikerString(moniker);
+    const QString none;
+    const QString& key = moniker ? *moniker : none;
     Threads::MutexTenure tenure(mMutex, nullptr);
-    return mTable.contains(key) || mTable.contains(QString());
+    return mTable.contains(key) || mTable.contains(none);
 }
 
 void Zel_EventCB::handleEvent(boost::shared_ptr<Zel_Event> event)
