@@ -7,11 +7,12 @@
 #include <QDateTime>
 #include <QDomDocument>
 #include <QDomElement>
-#include <QHash>
 #include <QStringView>
 
 #include <algorithm>
 #include <cstddef>
+#include <memory>
+#include <new>
 #include <vector>
 
 namespace {
@@ -33,40 +34,74 @@ struct Element
     const QChar* name;
     int nameLength;
     int parent;
-    uint hash; // of (parent, name)
     int firstChild = -1;
     int lastChild = -1;
     int nextSibling = -1;
-    int text = -1; // index of the setting whose value is the text; -1: none
+    int children = 0;              // child elements
+    const QString* text = nullptr; // the value of a setting, or none
+};
+
+// Elements in blocks of a fixed size, so that growing never moves them, and
+// blocks small enough for the allocator to reuse freed memory.
+class ElementStore
+{
+public:
+    Element& operator[](int index) { return mBlocks[index >> kBlockBits][index & kBlockMask]; }
+    const Element& operator[](int index) const { return mBlocks[index >> kBlockBits][index & kBlockMask]; }
+
+    int push(const Element& element)
+    {
+        if ((mSize & kBlockMask) == 0) {
+            Block block(static_cast<Element*>(::operator new(sizeof(Element) << kBlockBits)));
+            mBlocks.push_back(std::move(block));
+        }
+        new (&mBlocks.back()[mSize & kBlockMask]) Element(element);
+        return mSize++;
+    }
+
+private:
+    static const int kBlockBits = 10;
+    static const int kBlockMask = (1 << kBlockBits) - 1;
+
+    struct Release
+    {
+        void operator()(Element* block) const { ::operator delete(block); }
+    };
+
+    using Block = std::unique_ptr<Element[], Release>;
+
+    std::vector<Block> mBlocks;
+    int mSize = 0;
 };
 
 // The elements the settings' keys give: each level of a key is the first
 // child element of that name under the level before it, made when there is
-// none, and the last level is always a new element. Elements are found by
-// (parent, name) through an open-addressing table, so that a key costs time
-// in proportion to its length however wide the tree is. Every element is
-// registered, so that a leaf made by one key is found (and given children)
-// by a later key with it as a prefix, as "the first child with that name"
-// requires.
+// none, and the last level is always a new element.
+//
+// A child is found among few siblings by walking them; once an element has
+// kIndexedFrom children, its children are also entered, by (parent, name), in
+// an open-addressing table (the first child of each name only), so that a key
+// costs time in proportion to its length however wide the tree is, and the
+// table holds only the children of wide elements. A lookup under an element
+// without children costs nothing, and a last level is looked up only to keep
+// the table's "first child of that name" when its parent is wide.
 class ElementTree
 {
 public:
-    explicit ElementTree(int settings)
+    ElementTree()
+        : mSeed(ZelCompat::hashSeed())
     {
-        mElements.reserve(static_cast<std::size_t>(settings) + 1);
-        mElements.push_back(Element{nullptr, 0, -1, 0}); // the root
-        std::size_t capacity = 16;
-        while (capacity < static_cast<std::size_t>(settings) * 2)
-            capacity *= 2;
-        mSlots.assign(capacity, -1);
+        mElements.push(Element{nullptr, 0, -1}); // the root
+        mSlots.assign(64, Slot{0, -1});
     }
 
     // Adds the path of one key and returns its leaf element: -1 when the key
     // is empty, ends in "." (only the intermediate levels are made), has more
     // than kMaxLevels levels or yields an invalid element name (in the last
     // two cases nothing is made and *problem says why). The key's characters
-    // must outlive the tree: the elements refer to them.
-    int addPath(const QString& key, KeyProblem* problem)
+    // must outlive the tree: the elements refer to them. firstHash, if not
+    // null, is the hash of the first level that prefetch() gave.
+    int addPath(const QString& key, KeyProblem* problem, const uint* firstHash)
     {
         *problem = KeyProblem::None;
         if (key.isEmpty())
@@ -101,90 +136,191 @@ public:
         int parent = 0;
         begin = 0;
         for (int level = 0; level < last; ++level) {
+            const QChar* const name = data + begin;
             const int length = ends[level] - begin;
-            const uint hash = nameHash(parent, data + begin, length);
-            int* const slot = findSlot(parent, data + begin, length, hash);
-            parent = *slot >= 0 ? *slot : appendElement(parent, data + begin, length, hash, slot);
+            Probe probe;
+            const int found = findChild(parent, name, length, level == 0 ? firstHash : nullptr, &probe);
+            parent = found >= 0 ? found : appendChild(parent, level + 1, name, length, probe);
             begin = ends[level] + 1;
         }
         const int length = size - begin;
         if (length == 0)
             return -1;
-        const uint hash = nameHash(parent, data + begin, length);
-        int* const slot = findSlot(parent, data + begin, length, hash);
-        // An earlier element of that name stays the one later keys descend into.
-        return appendElement(parent, data + begin, length, hash, *slot >= 0 ? nullptr : slot);
+        const QChar* const name = data + begin;
+        // A leaf is looked up only in a wide parent, for the table's sake.
+        Probe probe;
+        if (isWide(element(parent)))
+            findChild(parent, name, length, last == 0 ? firstHash : nullptr, &probe);
+        return appendChild(parent, last + 1, name, length, probe);
     }
 
-    void setText(int element, int setting) { mElements[static_cast<std::size_t>(element)].text = setting; }
+    // Readies what adding the key will read when the root is wide: the table
+    // slot of the key's first level, which would otherwise be fetched from
+    // memory, at random, when its turn comes. Returns false when the root is
+    // not wide; otherwise sets *hash to the first level's hash, for addPath.
+    bool prefetch(const QString& key, uint* hash) const
+    {
+        if (!isWide(root()))
+            return false;
+        const QChar* const data = key.constData();
+        const int size = key.size();
+        int length = 0;
+        while (length < size && data[length] != QLatin1Char('.'))
+            ++length;
+        *hash = nameHash(0, data, length);
+#if defined(__GNUC__)
+        __builtin_prefetch(&mSlots[firstSlot(*hash)]);
+#endif
+        return true;
+    }
 
-    const Element& at(int index) const { return mElements[static_cast<std::size_t>(index)]; }
-    const Element& root() const { return mElements.front(); }
+    void setText(int index, const QString* text) { mElements[index].text = text; }
+
+    const Element& at(int index) const { return mElements[index]; }
+    const Element& root() const { return mElements[0]; }
+
+    // The most characters the elements' tags, indentation and line breaks take.
+    qsizetype markupSize() const { return mMarkupSize; }
 
 private:
-    static uint nameHash(int parent, const QChar* name, int length)
+    // From this many children on, an element's children are found through the table.
+    static const int kIndexedFrom = 8;
+
+    struct Slot
     {
-        return static_cast<uint>(qHash(QStringView(name, length))) ^ (static_cast<uint>(parent) * 0x9E3779B9u);
+        uint hash;
+        int element; // -1: empty
+    };
+
+    // Where a lookup in the table found no child: the empty slot where the
+    // child goes, if it is made before the table changes.
+    struct Probe
+    {
+        bool missed = false;
+        uint hash = 0;
+        std::size_t slot = 0;
+    };
+
+    Element& element(int index) { return mElements[index]; }
+
+    static bool isWide(const Element& element) { return element.children >= kIndexedFrom; }
+
+    static bool sameName(const Element& element, const QChar* name, int length)
+    {
+        return element.nameLength == length && std::equal(name, name + length, element.name);
     }
 
-    static std::size_t slotOf(uint hash, std::size_t mask)
+    // The first child of parent with this name, or -1; knownHash: the
+    // name's hash under parent, if known. *probe tells a miss in the table.
+    int findChild(int parent, const QChar* name, int length, const uint* knownHash, Probe* probe) const
     {
-        return static_cast<std::size_t>((static_cast<unsigned long long>(hash) * 0x9E3779B97F4A7C15ull) >> 24) & mask;
+        const Element& parentElement = at(parent);
+        if (!isWide(parentElement)) {
+            for (int child = parentElement.firstChild; child >= 0; child = at(child).nextSibling) {
+                if (sameName(at(child), name, length))
+                    return child;
+            }
+            return -1;
+        }
+        const uint hash = knownHash ? *knownHash : nameHash(parent, name, length);
+        const std::size_t slot = findSlot(parent, name, length, hash);
+        const int found = mSlots[slot].element;
+        if (found < 0)
+            *probe = Probe{true, hash, slot};
+        return found;
     }
 
-    // The slot holding the element (parent, name), or the empty slot where it
-    // would go.
-    int* findSlot(int parent, const QChar* name, int length, uint hash)
+    uint nameHash(int parent, const QChar* name, int length) const
+    {
+        return ZelCompat::hashText(QStringView(name, length), mSeed) ^ (static_cast<uint>(parent) * 0x9E3779B9u);
+    }
+
+    std::size_t firstSlot(uint hash) const
+    {
+        const unsigned long long spread = static_cast<unsigned long long>(hash) * 0x9E3779B97F4A7C15ull;
+        return static_cast<std::size_t>(spread >> 24) & (mSlots.size() - 1);
+    }
+
+    // The slot holding the child (parent, name), or the empty slot where it would go.
+    std::size_t findSlot(int parent, const QChar* name, int length, uint hash) const
     {
         const std::size_t mask = mSlots.size() - 1;
-        for (std::size_t i = slotOf(hash, mask);; i = (i + 1) & mask) {
-            const int index = mSlots[i];
-            if (index < 0)
-                return &mSlots[i];
-            const Element& element = at(index);
-            if (element.hash == hash && element.parent == parent && element.nameLength == length
-                && std::equal(name, name + length, element.name))
-                return &mSlots[i];
+        for (std::size_t i = firstSlot(hash);; i = (i + 1) & mask) {
+            const Slot& slot = mSlots[i];
+            if (slot.element < 0)
+                return i;
+            if (slot.hash == hash) {
+                const Element& candidate = at(slot.element);
+                if (candidate.parent == parent && sameName(candidate, name, length))
+                    return i;
+            }
         }
     }
 
-    // Appends a new last child to parent and registers it in slot, unless slot is null.
-    int appendElement(int parent, const QChar* name, int length, uint hash, int* slot)
+    // Enters the child in the table at the empty slot, keeping the table at
+    // most half full.
+    void enter(int child, uint hash, std::size_t slot)
     {
-        const int index = static_cast<int>(mElements.size());
-        mElements.push_back(Element{name, length, parent, hash});
-        Element& parentElement = mElements[static_cast<std::size_t>(parent)];
+        mSlots[slot] = Slot{hash, child};
+        if (++mEntered * 2 > mSlots.size())
+            grow();
+    }
+
+    // Enters the child in the table, unless a child of that name is there.
+    void enterIfFirst(int child)
+    {
+        const Element& entered = at(child);
+        const uint hash = nameHash(entered.parent, entered.name, entered.nameLength);
+        const std::size_t slot = findSlot(entered.parent, entered.name, entered.nameLength, hash);
+        if (mSlots[slot].element < 0)
+            enter(child, hash, slot);
+    }
+
+    // Appends a new last child, at this depth, to parent. probe: the lookup
+    // of its name in parent, if parent is wide.
+    int appendChild(int parent, int depth, const QChar* name, int length, const Probe& probe)
+    {
+        // Both tags indented, "<></>", "/" or a line break after the start
+        // tag, a line break after the end tag: at most this much.
+        mMarkupSize += 2 * qsizetype(depth + length) + 7;
+        const int index = mElements.push(Element{name, length, parent});
+        Element& parentElement = element(parent);
         if (parentElement.lastChild >= 0)
-            mElements[static_cast<std::size_t>(parentElement.lastChild)].nextSibling = index;
+            element(parentElement.lastChild).nextSibling = index;
         else
             parentElement.firstChild = index;
         parentElement.lastChild = index;
-        if (slot) {
-            *slot = index;
-            if (++mRegistered * 2 > mSlots.size())
-                grow();
+        if (++parentElement.children == kIndexedFrom) {
+            // From now on the children are found through the table.
+            for (int child = parentElement.firstChild; child >= 0; child = at(child).nextSibling)
+                enterIfFirst(child);
+        } else if (probe.missed) {
+            // The first child of its name in a wide parent.
+            enter(index, probe.hash, probe.slot);
         }
         return index;
     }
 
     void grow()
     {
-        std::vector<int> old(mSlots.size() * 2, -1);
+        std::vector<Slot> old(mSlots.size() * 2, Slot{0, -1});
         old.swap(mSlots);
         const std::size_t mask = mSlots.size() - 1;
-        for (const int index : old) {
-            if (index < 0)
+        for (const Slot& slot : old) {
+            if (slot.element < 0)
                 continue;
-            std::size_t i = slotOf(at(index).hash, mask);
-            while (mSlots[i] >= 0)
+            std::size_t i = firstSlot(slot.hash);
+            while (mSlots[i].element >= 0)
                 i = (i + 1) & mask;
-            mSlots[i] = index;
+            mSlots[i] = slot;
         }
     }
 
-    std::vector<Element> mElements;
-    std::vector<int> mSlots;
-    std::size_t mRegistered = 0;
+    const std::size_t mSeed;
+    ElementStore mElements;
+    std::vector<Slot> mSlots;
+    std::size_t mEntered = 0;
+    qsizetype mMarkupSize = 0;
 };
 
 // Writes the document text straight into a QString through a pointer,
@@ -202,9 +338,8 @@ private:
 class DocumentWriter
 {
 public:
-    DocumentWriter(const ElementTree& tree, const Zel_SettingList& settings, qsizetype expectedSize)
+    DocumentWriter(const ElementTree& tree, qsizetype expectedSize)
         : mTree(tree)
-        , mSettings(settings)
     {
         mText.resize(std::max<qsizetype>(expectedSize, 256));
         mOut = mText.data();
@@ -238,22 +373,21 @@ private:
             indent(depth);
         put(QLatin1Char('<'));
         put(element.name, element.nameLength);
-        if (element.text < 0 && element.firstChild < 0) {
+        if (!element.text && element.firstChild < 0) {
             put(QLatin1Char('/'));
             put(QLatin1Char('>'));
             put(QLatin1Char('\n'));
             return;
         }
         put(QLatin1Char('>'));
-        if (element.text >= 0) {
-            const QString value = mSettings.at(element.text).value();
-            reserve(qsizetype(value.size()) * ZelXml::kMaxEscapedLength);
-            mOut = ZelXml::writeElementText(value, mOut);
+        if (element.text) {
+            reserve(qsizetype(element.text->size()) * ZelXml::kMaxEscapedLength);
+            mOut = ZelXml::writeElementText(*element.text, mOut);
         } else {
             put(QLatin1Char('\n'));
         }
         for (int child = element.firstChild; child >= 0; child = mTree.at(child).nextSibling)
-            writeElement(child, depth + 1, child == element.firstChild && element.text >= 0);
+            writeElement(child, depth + 1, child == element.firstChild && element.text);
         reserve(depth + element.nameLength + 4);
         if (element.firstChild >= 0)
             indent(depth);
@@ -277,7 +411,6 @@ private:
     void indent(int depth) { mOut = std::fill_n(mOut, depth, QChar(QLatin1Char(' '))); }
 
     const ElementTree& mTree;
-    const Zel_SettingList& mSettings;
     QString mText;
     QChar* mOut = nullptr;
 };
@@ -362,32 +495,43 @@ const QString Zel_SettingList::toXML(const QString& rootName, const QDateTime& m
     }
 
     const boost::shared_ptr<Zel_Debug> trace = Zel_Debug::instance();
-    // The keys stay here while the elements refer to their characters.
-    std::vector<QString> keys;
-    keys.reserve(static_cast<std::size_t>(size()));
-    ElementTree tree(size());
-    qsizetype expectedSize = 0;
-    for (int i = 0; i < size(); ++i) {
-        keys.push_back(at(i).key());
-        const QString& key = keys.back();
+    // The elements refer to the characters of the keys, which the list keeps.
+    ElementTree tree;
+    qsizetype textSize = 0; // the values as they are; escapes add to it
+    qsizetype longestText = 0;
+    // In a wide root, the first level of the key kAhead places ahead is
+    // hashed and its table slot fetched, in a ring of kAhead places.
+    const int kAhead = 8;
+    uint aheadHash[kAhead];
+    bool ahead[kAhead] = {};
+    const int count = size();
+    for (int i = 0; i < count; ++i) {
+        const QString& key = at(i).mKey;
+        const int place = i % kAhead;
         KeyProblem problem = KeyProblem::None;
-        const int leaf = tree.addPath(key, &problem);
+        const int leaf = tree.addPath(key, &problem, ahead[place] ? &aheadHash[place] : nullptr);
+        ahead[place] = i + kAhead < count && tree.prefetch(at(i + kAhead).mKey, &aheadHash[place]);
         if (problem != KeyProblem::None) {
             if (trace->getEnabled())
                 trace->debug(QLatin1String(kTraceSource), leftOutText(key, problem), 0);
             continue;
         }
-        if (leaf >= 0)
-            tree.setText(leaf, i);
-        // Roughly: both tags, indentation, the value.
-        expectedSize += 2 * key.size() + 16;
+        if (leaf >= 0) {
+            const QString& value = at(i).mValue;
+            tree.setText(leaf, &value);
+            textSize += value.size();
+            longestText = std::max<qsizetype>(longestText, value.size());
+        }
     }
 
     const QString tag = rootTag(rootName, modifyDate.isValid() ? modifyDate : QDateTime::currentDateTime());
     Q_ASSERT(tag.endsWith(QLatin1String("/>\n")));
     if (tree.root().firstChild < 0)
         return tag;
-    DocumentWriter writer(tree, *this, expectedSize + 2 * tag.size());
+    // Room for the whole text unless escapes lengthen the values a lot; the
+    // writer asks for room for the longest value escaped throughout.
+    DocumentWriter writer(tree, tree.markupSize() + textSize + textSize / 8
+                                    + longestText * (ZelXml::kMaxEscapedLength - 1) + 2 * tag.size() + 64);
     // "<Root .../>\n" becomes "<Root ...>\n" ... "</Root>\n".
     writer.write(QStringView(tag).left(tag.size() - 3));
     writer.write(u">\n");
