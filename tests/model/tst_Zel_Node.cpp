@@ -470,3 +470,117 @@ TEST(Zel_NodeTest, ColorFromNameIgnoresCase)
     for (const char* unknown : {"red", "", "blu", "blue ", "zzz", "aaa", "bl\xDC" "e", "\xC0\xFF", (const char*)nullptr})
         EXPECT_EQ(Zel_Node::colorFromName(unknown), -1) << (unknown ? unknown : "null");
 }
+
+namespace {
+
+// Counts the reads of the three texts that order it.
+class CountingNode : public TestNode
+{
+public:
+    using TestNode::TestNode;
+    QString getName() override { ++names; return TestNode::getName(); }
+    QString getMimeType() override { ++mimeTypes; return TestNode::getMimeType(); }
+    QString getMoniker() override { ++monikers; return TestNode::getMoniker(); }
+    int names = 0;
+    int mimeTypes = 0;
+    int monikers = 0;
+};
+
+std::vector<const Zel_Node*> pointers(const QList<boost::shared_ptr<Zel_Node>>& nodes)
+{
+    std::vector<const Zel_Node*> result;
+    for (const boost::shared_ptr<Zel_Node>& node : nodes)
+        result.push_back(node.get());
+    return result;
+}
+
+} // namespace
+
+TEST(Zel_NodeListTest, SortByOrderGivesTheOrderOfAStableSortWithLess)
+{
+    // Random sets of every size class: ties (equal kind, name and moniker,
+    // which must keep their order), case variants, non-Latin-1 and broken
+    // UTF-16 names, empty names and monikers, unknown and empty mime types.
+    const int sizes[] = {0, 1, 2, 3, 7, 40, 250, 1500};
+    for (std::uint32_t seed = 1; seed <= 48; ++seed) {
+        std::mt19937 random(seed);
+        const int count = sizes[seed % (sizeof sizes / sizeof sizes[0])];
+        std::vector<NodeSP> sample = randomNodes(random, count);
+        // Exact copies of earlier nodes, distinct objects.
+        std::uniform_int_distribution<int> copyOf(0, count > 0 ? count - 1 : 0);
+        for (int i = 0; i < count / 4; ++i) {
+            const NodeSP original = sample[copyOf(random)];
+            sample.push_back(boost::make_shared<TestNode>(original->getMimeType(), original->getName(), original->getMoniker()));
+        }
+        std::shuffle(sample.begin(), sample.end(), random);
+
+        Zel_NodeList list;
+        QList<boost::shared_ptr<Zel_Node>> plain;
+        for (const NodeSP& n : sample) {
+            list.append(n);
+            plain.append(n);
+        }
+        std::vector<boost::shared_ptr<Zel_Node>> expected(list.begin(), list.end());
+        std::stable_sort(expected.begin(), expected.end(),
+                         [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+        std::vector<const Zel_Node*> expectedPointers;
+        for (const boost::shared_ptr<Zel_Node>& n : expected)
+            expectedPointers.push_back(n.get());
+
+        const Zel_NodeList unsorted = list; // shares the items until sorted
+        list.sortByOrder();
+        ASSERT_EQ(pointers(list), expectedPointers) << "seed " << seed << ", " << sample.size() << " nodes";
+        Zel_NodeList::sortByOrder(plain);
+        ASSERT_EQ(pointers(plain), expectedPointers) << "seed " << seed;
+        // The copy taken before is untouched.
+        std::vector<const Zel_Node*> before;
+        for (const NodeSP& n : sample)
+            before.push_back(n.get());
+        ASSERT_EQ(pointers(unsorted), before) << "seed " << seed;
+    }
+}
+
+TEST(Zel_NodeListTest, SortByOrderReadsEachNodeOnceAndPutsNullsLast)
+{
+    // Twenty nodes of four names in two cases and two kinds, every name
+    // twice with one moniker: many ties to break by name, moniker and place.
+    std::vector<boost::shared_ptr<CountingNode>> counted;
+    Zel_NodeList list;
+    for (int i = 0; i < 20; ++i) {
+        const QString name = QString::fromLatin1(i % 2 ? "Take " : "take ") + QString::number(i % 4);
+        counted.push_back(boost::make_shared<CountingNode>(QString::fromLatin1(i % 3 ? "clip" : "bin"), name,
+                                                           QString::fromLatin1(i % 5 ? "m" : "n")));
+        list.append(counted.back());
+        if (i % 6 == 0)
+            list.append(boost::shared_ptr<Zel_Node>());
+    }
+    std::vector<boost::shared_ptr<Zel_Node>> expected;
+    for (const boost::shared_ptr<CountingNode>& n : counted)
+        expected.push_back(n);
+    const auto less = [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; };
+    std::stable_sort(expected.begin(), expected.end(), less);
+    for (const boost::shared_ptr<CountingNode>& n : counted)
+        n->names = n->mimeTypes = n->monikers = 0;
+
+    list.sortByOrder();
+
+    for (const boost::shared_ptr<CountingNode>& n : counted) {
+        EXPECT_EQ(n->names, 1);
+        EXPECT_EQ(n->mimeTypes, 1);
+        EXPECT_EQ(n->monikers, 1);
+    }
+    ASSERT_EQ(list.size(), 24);
+    for (int i = 0; i < 20; ++i)
+        EXPECT_EQ(list.at(i).get(), expected[i].get()) << i;
+    for (int i = 20; i < 24; ++i)
+        EXPECT_FALSE(list.at(i)) << i;
+
+    // Nothing to do for no node or one.
+    Zel_NodeList one;
+    one.append(counted.front());
+    one.sortByOrder();
+    Zel_NodeList none;
+    none.sortByOrder();
+    EXPECT_EQ(one.size(), 1);
+    EXPECT_TRUE(none.isEmpty());
+}
