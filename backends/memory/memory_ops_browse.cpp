@@ -27,11 +27,11 @@
 #include "Zel_RootNodeCB.h"
 
 #include "Zel_Node.h"
+#include "Zel_NodeList.h"
 
 #include <QFileInfo>
 #include <QSet>
 
-#include <algorithm>
 
 namespace ZelMemory {
 
@@ -53,8 +53,7 @@ QList<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& pare
         if (child && (work.tree.permissionsOf(work.user, *child) & PermRead))
             children.append(work.snapshot(*child));
     }
-    std::stable_sort(children.begin(), children.end(),
-                     [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+    Zel_NodeList::sortByOrder(children);
     return children;
 }
 
@@ -345,8 +344,7 @@ void QueryOp::run(Work& work, const Args& args, Result& result)
         if ((work.tree.permissionsOf(work.user, node) & PermRead) && matchesQuery(work.tree, node, query))
             found.append(work.snapshot(node));
     }
-    std::stable_sort(found.begin(), found.end(),
-                     [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+    Zel_NodeList::sortByOrder(found);
     for (const boost::shared_ptr<Zel_Node>& node : found)
         result.succeed(node);
 }
