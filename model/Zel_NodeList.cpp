@@ -155,14 +155,17 @@ void Zel_NodeList::sortByOrder(QList<boost::shared_ptr<Zel_Node>>& nodes)
         entries[i] = SortEntry{prefix, static_cast<std::uint32_t>(start), static_cast<std::uint32_t>(i)};
     }
 
-    // Rank and lowered name, then exact name, then moniker, then position:
-    // no two entries are equal, so std::sort gives the stable order. Packed
-    // units that differ decide; equal ones may still hide shorter keys padded
-    // with zeros, so the whole keys are compared then.
+    // First by the packed units alone, which needs nothing but the entries;
+    // then each run of equal packed units by rank and lowered name, exact
+    // name, moniker and position. No two entries are equal in that order, so
+    // std::sort gives the stable order. Sorting a run at a time keeps the
+    // buffer reads of one run together, and they are fetched ahead.
+    std::sort(entries.begin(), entries.end(),
+              [](const SortEntry& a, const SortEntry& b) { return a.prefix < b.prefix; });
     const ushort* buffer = units.data();
-    std::sort(entries.begin(), entries.end(), [buffer](const SortEntry& a, const SortEntry& b) {
-        if (a.prefix != b.prefix)
-            return a.prefix < b.prefix;
+    const auto fullLess = [buffer](const SortEntry& a, const SortEntry& b) {
+        // Equal packed units may still hide shorter keys padded with zeros,
+        // so the whole keys are compared.
         const ushort* headerA = buffer + a.start;
         const ushort* headerB = buffer + b.start;
         const ushort* runA = headerA + kHeaderUnits;
@@ -177,7 +180,20 @@ void Zel_NodeList::sortByOrder(QList<boost::shared_ptr<Zel_Node>>& nodes)
             runB += sizeB;
         }
         return a.index < b.index;
-    });
+    };
+    for (auto run = entries.begin(); run != entries.end();) {
+        auto runEnd = run + 1;
+        while (runEnd != entries.end() && runEnd->prefix == run->prefix)
+            ++runEnd;
+        if (runEnd - run > 1) {
+#if defined(__GNUC__)
+            for (auto entry = run; entry != runEnd; ++entry)
+                __builtin_prefetch(buffer + entry->start);
+#endif
+            std::sort(run, runEnd, fullLess);
+        }
+        run = runEnd;
+    }
 
     // Move the nodes into place by following the permutation's cycles:
     // swaps of list items, no copies and no allocation. A position whose

@@ -109,19 +109,22 @@ private:
 // first, zero only when a == b, positive when b sorts first.
 int compareNames(const QString& a, const QString& b);
 
-// Appends the units of name.toLower() to out.
+// Appends the units of name.toLower() to out, a vector of ushort or alike.
 template <class Units>
 void appendLowered(const QString& name, Units& out)
 {
     const QChar* text = name.constData();
     const int size = name.size();
     const auto start = out.size();
+    // Latin-1 runs, the common case, lower one unit to one unit.
+    out.resize(start + size);
+    auto* lowered = out.data() + start;
     int i = 0;
-    // Latin-1 runs, the common case, a unit at a time.
     for (; i < size && text[i].unicode() < 0x100; ++i)
-        out.push_back(latin1ToLower(text[i].unicode()));
+        lowered[i] = latin1ToLower(text[i].unicode());
     if (i == size)
         return;
+    out.resize(start + i);
     LoweredUnits units(text, size, i);
     ushort unit;
     for (;;) {
@@ -134,8 +137,8 @@ void appendLowered(const QString& name, Units& out)
     }
     // An unpaired surrogate: Qt's own lowering of the whole text.
     out.resize(start);
-    const QString lowered = name.toLower();
-    for (const QChar c : lowered)
+    const QString whole = name.toLower();
+    for (const QChar c : whole)
         out.push_back(c.unicode());
 }
 
