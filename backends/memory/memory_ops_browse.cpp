@@ -26,6 +26,7 @@
 #include "Zel_RefreshNodeCB.h"
 #include "Zel_RootNodeCB.h"
 
+#include "Zel_MimeTypeSpec.h"
 #include "Zel_Node.h"
 
 #include <QFileInfo>
@@ -45,16 +46,113 @@ boost::shared_ptr<QString> sharedText(const QString& text)
     return boost::shared_ptr<QString>(new QString(text));
 }
 
-QList<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent)
+namespace {
+
+// A child's place in node order: the key Zel_Node::operator< compares (the
+// mime type's rank, the lowered name, the name, the moniker), held compactly
+// for sorting many children. The lowered name's first units are kept in the
+// key itself, so that most comparisons read nothing else; the rest of the key
+// is reached through index only when the first units do not decide.
+struct OrderKey {
+    static const int PrefixUnits = 12;
+    long rank;
+    std::uint32_t length; // of the lowered name
+    std::uint32_t index;  // of the child in the sorter's lists
+    ushort prefix[PrefixUnits];
+};
+
+class ChildOrder
 {
-    QList<boost::shared_ptr<Zel_Node>> children;
+public:
+    explicit ChildOrder(std::size_t count)
+    {
+        mKeys.reserve(count);
+        mLowered.reserve(count);
+        mNodes.reserve(count);
+    }
+
+    void add(const Node& node)
+    {
+        OrderKey key;
+        key.rank = Zel_MimeTypeSpec::getSortOrder(node.mimeType);
+        const QString lowered = node.name.toLower();
+        key.length = static_cast<std::uint32_t>(lowered.size());
+        key.index = static_cast<std::uint32_t>(mKeys.size());
+        const int units = std::min(lowered.size(), static_cast<int>(OrderKey::PrefixUnits));
+        for (int i = 0; i < units; ++i)
+            key.prefix[i] = lowered.at(i).unicode();
+        mKeys.push_back(key);
+        mLowered.push_back(lowered);
+        mNodes.push_back(&node);
+    }
+
+    // The nodes given to add(), in node order.
+    std::vector<const Node*> sorted()
+    {
+        std::sort(mKeys.begin(), mKeys.end(), [this](const OrderKey& a, const OrderKey& b) { return less(a, b); });
+        std::vector<const Node*> nodes;
+        nodes.reserve(mKeys.size());
+        for (const OrderKey& key : mKeys)
+            nodes.push_back(mNodes[key.index]);
+        return nodes;
+    }
+
+private:
+    bool less(const OrderKey& a, const OrderKey& b) const
+    {
+        if (a.rank != b.rank)
+            return a.rank < b.rank;
+        // The lowered names by UTF-16 unit, as QString's operator< compares.
+        const std::uint32_t common = std::min(a.length, b.length);
+        const std::uint32_t inKey = std::min(common, static_cast<std::uint32_t>(OrderKey::PrefixUnits));
+        for (std::uint32_t i = 0; i < inKey; ++i) {
+            if (a.prefix[i] != b.prefix[i])
+                return a.prefix[i] < b.prefix[i];
+        }
+        if (inKey < common) {
+            const QString& loweredA = mLowered[a.index];
+            const QString& loweredB = mLowered[b.index];
+            if (loweredA != loweredB)
+                return loweredA < loweredB;
+        } else if (a.length != b.length) {
+            return a.length < b.length;
+        }
+        const Node& nodeA = *mNodes[a.index];
+        const Node& nodeB = *mNodes[b.index];
+        if (nodeA.name != nodeB.name)
+            return nodeA.name < nodeB.name;
+        return nodeA.moniker < nodeB.moniker;
+    }
+
+    std::vector<OrderKey> mKeys;
+    std::vector<QString> mLowered;
+    std::vector<const Node*> mNodes;
+};
+
+} // namespace
+
+std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent)
+{
+    // The records are put in node order first, each child's place worked out
+    // once (ChildOrder): the sort moves small keys and reaches into a record
+    // only when the names' first units tie. In a large folder, comparing
+    // snapshots through their virtual getters, or texts spread over the heap,
+    // would wait for memory at every step. The snapshots are then taken in
+    // that order, so that they lie in memory in the order they are delivered.
+    // Monikers are unique, so no two keys are equal and the order is the one
+    // a stable sort of the snapshots gives.
+    const SnapshotContext context = childContext(work.tree, &parent, work.user);
+    const std::size_t count = static_cast<std::size_t>(parent.children.size());
+    ChildOrder order(count);
     for (const QString& id : parent.children) {
         const Node* child = work.tree.byId(id);
-        if (child && (work.tree.permissionsOf(work.user, *child) & PermRead))
-            children.append(work.snapshot(*child));
+        if (child && (work.tree.permissionsBelow(work.user, *child, context.permissions) & PermRead))
+            order.add(*child);
     }
-    std::stable_sort(children.begin(), children.end(),
-                     [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+    std::vector<boost::shared_ptr<Zel_Node>> children;
+    children.reserve(count);
+    for (const Node* child : order.sorted())
+        children.push_back(work.snapshot(*child, context));
     return children;
 }
 
@@ -236,8 +334,10 @@ void GetChildrenOp::run(Work& work, const Args& args, Result& result)
     ReadHold hold(work.tree);
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
-    for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
-        result.setResult(child, ok());
+    // One "no error" record serves every answer: it never reaches a handler.
+    const boost::shared_ptr<Zel_Error> success = ok();
+    for (boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
+        result.setResult(std::move(child), success);
 }
 ZEL_MEMORY_EXECUTE(GetChildrenOp)
 
@@ -247,8 +347,11 @@ void ChildrenOp::run(Work& work, const Args& args, Result& result)
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
     // Each child with its has-children flag.
-    for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
-        result.setResult(child, false, child->getChildrenCount() > 0, ok());
+    const boost::shared_ptr<Zel_Error> success = ok(); // shared, as in GetChildrenOp
+    for (boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent)) {
+        const bool hasChildren = child->getChildrenCount() > 0;
+        result.setResult(std::move(child), false, hasChildren, success);
+    }
 }
 ZEL_MEMORY_EXECUTE(ChildrenOp)
 

@@ -29,6 +29,7 @@
 #include <boost/shared_ptr.hpp>
 
 #include <type_traits>
+#include <vector>
 
 class Orv_Result;
 class Zel_LoginCredentials;
@@ -144,8 +145,9 @@ typedef boost::shared_ptr<QString> MonikerSP;
 // Shared by the operations (memory_ops_browse.cpp).
 boost::shared_ptr<Zel_Error> ok();
 boost::shared_ptr<QString> sharedText(const QString& text);
-// The children of the node the user may read, as snapshots in node order.
-QList<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent);
+// The children of the node the user may read, as snapshots in node order
+// (the order of Zel_Node::operator<).
+std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent);
 // The node's locators (restrictions = false) or restrictions (true).
 QList<Zel_FrameLocator> markersOf(const Node& node, bool restrictions);
 // Fails with TooDeep unless a subtree of the given height (0: one node) fits

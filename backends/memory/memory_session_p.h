@@ -123,7 +123,10 @@ public:
     boost::shared_ptr<const FaultHook> faultHook() const;
     void setFaultHook(const boost::shared_ptr<const FaultHook>& hook);
 
-    // Keeps a weak reference to the request, for cancelAll().
+    // Keeps a weak reference to the request, for cancelAll(). The references
+    // of requests that are gone are dropped whenever the list has doubled
+    // since it was last swept, so that making a request costs the same with
+    // any number of requests in flight.
     void track(const boost::shared_ptr<Cancelable>& request);
     void cancelAll();
 
@@ -137,8 +140,22 @@ private:
     QString mIllegalAssetCharacters;
     QString mIllegalPropertyCharacters;
     std::vector<boost::weak_ptr<Cancelable>> mRequests;
+    std::size_t mSweepAt = MinSweepSize; // sweep when mRequests reaches this size
+    static constexpr std::size_t MinSweepSize = 64;
     boost::shared_ptr<const FaultHook> mFaultHook; // boost::atomic_load / atomic_store
 };
+
+// What the snapshots of one parent's children have in common, worked out
+// once: a folder's children are snapshotted without walking up the tree for
+// each of them.
+struct SnapshotContext {
+    const Node* parent = nullptr;  // null for the root
+    QStringList path;              // tree.pathOf(*parent)
+    bool syncedProject = false;    // the parent lies at or below a synced project
+    std::uint32_t permissions = 0; // tree.permissionsOf(user, *parent)
+};
+// The context of parent's children (parent null: of the root).
+SnapshotContext childContext(const Tree& tree, const Node* parent, const QString& user);
 
 // The context of one request's work.
 class Work
@@ -166,7 +183,17 @@ public:
 
     // A snapshot of the node for the application.
     boost::shared_ptr<Zel_Node> snapshot(const Node& node);
+    // The same for a child of the context's parent.
+    boost::shared_ptr<Zel_Node> snapshot(const Node& node, const SnapshotContext& context);
 };
+
+// The snapshot of node that the requests of user answer with (tree is owner's
+// data, held by the caller); context is that of node's parent.
+boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& node, const QString& user,
+                                       const SnapshotContext& context, const boost::shared_ptr<Zel_MemoryTree>& owner);
+// The same, working the context out.
+boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& node, const QString& user,
+                                       const boost::shared_ptr<Zel_MemoryTree>& owner);
 
 // A final result of the operation's result class holding only the failure.
 template <class Op>

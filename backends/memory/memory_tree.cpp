@@ -194,6 +194,28 @@ std::uint32_t Tree::permissionsOf(const QString& userName, const Node& node) con
     return 0;
 }
 
+std::uint32_t Tree::permissionsBelow(const QString& userName, const Node& node, std::uint32_t parentPermissions) const
+{
+    const User* u = user(userName);
+    if (!u)
+        return 0;
+    if (u->admin)
+        return AllPermissions;
+    auto own = node.permissions.constFind(userName);
+    if (own != node.permissions.constEnd())
+        return own.value();
+    auto all = node.permissions.constFind(QStringLiteral("*"));
+    if (all != node.permissions.constEnd())
+        return all.value();
+    return parentPermissions;
+}
+
+bool Tree::isSyncedProject(const Node& node) const
+{
+    return node.mimeType == QLatin1String("project")
+        && !propertyValue(node, QStringLiteral("SyncedProject_GUID")).isEmpty();
+}
+
 const Node* Tree::reservedByOther(const Node& node, const QString& userName, bool below) const
 {
     if (node.reservation.isActive() && node.reservation.user != userName)

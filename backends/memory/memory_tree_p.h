@@ -264,6 +264,12 @@ public:
     // node (this one, then upwards) with an entry for the user, or for "*",
     // decides (the user's own entry wins over "*" on the same node).
     std::uint32_t permissionsOf(const QString& user, const Node& node) const;
+    // The same answer for a node whose parent's answer is known
+    // (parentPermissions = permissionsOf(user, parent); 0 for the root),
+    // without walking up: the node's own entry, or else its parent's answer.
+    std::uint32_t permissionsBelow(const QString& user, const Node& node, std::uint32_t parentPermissions) const;
+    // True when the node is a project that carries a synced project GUID.
+    bool isSyncedProject(const Node& node) const;
     // The first node at (and, with below, under) node whose active
     // reservation is held by someone other than user.
     const Node* reservedByOther(const Node& node, const QString& user, bool below = true) const;
