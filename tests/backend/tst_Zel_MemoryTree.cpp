@@ -242,6 +242,37 @@ TEST(Zel_MemoryTreeTest, UnknownKeyTypeIsRefused)
               loadError(json));
 }
 
+TEST(Zel_MemoryTreeTest, PathsInMessagesNameTheNodeAmongManyAndDeepInTheTree)
+{
+    // A node's path is written out only for a message: it must still count
+    // the children of every folder on the way, in file order.
+    auto tree = [](const QByteArray& last) {
+        QByteArray json = "{\"users\":[{\"name\":\"u\"}],\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":[";
+        for (int i = 0; i < 3; ++i)
+            json += "{\"name\":\"Bin " + QByteArray::number(i) + "\",\"mimeType\":\"bin\"},";
+        json += "{\"id\":\"F\",\"name\":\"Folder\",\"mimeType\":\"bin\",\"children\":[";
+        for (int i = 0; i < 20; ++i)
+            json += "{\"name\":\"Clip " + QByteArray::number(i) + "\",\"mimeType\":\"masterclip\"},";
+        json += last + "]}]}}";
+        return json;
+    };
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].name: a second child named \"Clip 7\" in \"Folder\""),
+              loadError(tree("{\"name\":\"Clip 7\",\"mimeType\":\"masterclip\"}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].properties.Name: set by \"name\", \"mimeType\" and "
+                             "\"mobID\", not as a property"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"properties\":{\"Name\":\"Y\"}}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].properties.Tape.value: expected a string"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"properties\":{\"Tape\":{\"value\":1}}}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].reservation.since: \"soon\" is not an ISO 8601 "
+                             "date and time"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"reservation\":{\"user\":\"u\",\"since\":\"soon\"}}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].locators[0].id: missing"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"locators\":[{}]}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].master: no node has the moniker or ID \"Z\""),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"subclip\",\"master\":\"Z\"}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20]: expected an object"), loadError(tree("7")));
+}
+
 TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
 {
     // A second "children" would silently replace the first subtree.
@@ -257,6 +288,19 @@ TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
     const QByteArray escaped = "{\"root\":{\"id\":\"R\",\"name\":\"\xc3\xa9t\xc3\xa9\",\"n\\u0061me\":\"Root\",\"mimeType\":\"workspace\"}}";
     EXPECT_EQ(QStringLiteral("tree.json:1:32: a second member named \"name\" in one object (the first is at 1:19)"),
               loadError(escaped));
+
+    // Objects with many names are searched as thoroughly as small ones, and a
+    // name written with an escape is the same as one written plainly.
+    QByteArray many = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"settings\":{";
+    for (int i = 0; i < 40; ++i)
+        many += "\"k" + QByteArray::number(i) + "\":\"v\",";
+    EXPECT_EQ(QStringLiteral("tree.json:1:458: a second member named \"k17\" in one object (the first is at 1:228)"),
+              loadError(many + "\"k\\u00317\":\"w\"}}}"));
+    EXPECT_EQ(QStringLiteral("tree.json:1:458: a second member named \"k3\" in one object (the first is at 1:95)"),
+              loadError(many + "\"k3\":\"w\"}}}"));
+    const QByteArray plainAfterEscaped = "{\"root\":{\"n\\u0061me\":\"Root\",\"name\":\"Root\"}}";
+    EXPECT_EQ(QStringLiteral("tree.json:1:29: a second member named \"name\" in one object (the first is at 1:10)"),
+              loadError(plainAfterEscaped));
 
     // A text broken near the second name is a syntax error, not a duplicate.
     const QString broken = loadError("{\"root\":{}, \"root\" {}}");
