@@ -2,9 +2,15 @@
 
 #include "Threads_MutexTenure.h"
 #include "Zel_Event.h"
+#include "Zel_EventChildAdded.h"
+#include "Zel_EventChildRemoved.h"
+#include "Zel_EventChildUpdated.h"
 #include "Zel_EventListener.h"
+#include "Zel_EventListenerFolderImpl_p.h"
 
+#include <atomic>
 #include <exception>
+#include <typeinfo>
 
 Zel_EventCB::Zel_EventCB()
     : Orv_ResultsCB(Orv_RequestID(Orv_RequestID::Callback))
@@ -65,49 +71,93 @@ void Zel_EventCB::UnregisterAll()
 
 bool Zel_EventCB::hasRegisteredListener(boost::shared_ptr<QString> moniker)
 {
-    const QString key = getMonikerString(moniker);
+    const QString none;
+    const QString& key = moniker ? *moniker : none;
     Threads::MutexTenure tenure(mMutex, nullptr);
-    return mTable.contains(key) || mTable.contains(QString());
+    return mTable.contains(key) || mTable.contains(none);
 }
 
 void Zel_EventCB::handleEvent(boost::shared_ptr<Zel_Event> event)
 {
+    deliver(event);
+}
+
+void Zel_EventCB::deliver(const boost::shared_ptr<Zel_Event>& event)
+{
     if (!event)
         return;
 
+    // The library's own child events are recognised by their exact class, so
+    // that no override can change what they answer: their code, moniker and
+    // child are read here, once and without copies, instead of once per
+    // listener. Any other event (a class derived from them included) is left
+    // to each listener's handleEvent.
+    Zel_Event& received = *event;
+    const std::type_info& eventClass = typeid(received);
+    unsigned long childType = 0;
+    const boost::shared_ptr<QString>* child = nullptr;
+    if (&eventClass == &typeid(Zel_EventChildAdded)) {
+        childType = 1;
+        child = &static_cast<Zel_EventChildAdded&>(received).mChildMoniker;
+    } else if (&eventClass == &typeid(Zel_EventChildRemoved)) {
+        childType = 2;
+        child = &static_cast<Zel_EventChildRemoved&>(received).mChildMoniker;
+    } else if (&eventClass == &typeid(Zel_EventChildUpdated)) {
+        childType = 4;
+        child = &static_cast<Zel_EventChildUpdated&>(received).mChildMoniker;
+    }
+
     Threads::MutexTenure tenure(mMutex, nullptr);
-    const QString key = getMonikerString(event->getMonikerSP());
+    // The virtual getMonikerSP() of any other event class.
+    boost::shared_ptr<QString> asked;
+    if (!child)
+        asked = received.getMonikerSP();
+    const boost::shared_ptr<QString>& moniker = child ? received.mMoniker : asked;
+    const QString none;
+    const QString& key = moniker && !moniker->isEmpty() ? *moniker : none;
 
     // Snapshots (shared, not copied, until the table changes): re-entrant
     // registrations during the calls below cannot disturb this delivery.
-    Zel_EventListenerSPList forMoniker;
-    Zel_EventListenerSPList forEveryNode;
+    QList<boost::shared_ptr<Zel_EventListener>> forMoniker;
+    QList<boost::shared_ptr<Zel_EventListener>> forEveryNode;
     if (!key.isEmpty()) {
         const Table::const_iterator found = mTable.constFind(key);
         if (found != mTable.constEnd())
             forMoniker = *found;
     }
-    const Table::const_iterator all = mTable.constFind(QString());
+    const Table::const_iterator all = mTable.constFind(none);
     if (all != mTable.constEnd())
         forEveryNode = *all;
 
     const std::uint64_t changesAtStart = mChanges;
-    processEvent(forMoniker, key, event, changesAtStart);
-    processEvent(forEveryNode, QString(), event, changesAtStart);
+    if (!forMoniker.isEmpty())
+        processEvent(forMoniker, key, event, childType, child, changesAtStart);
+    if (!forEveryNode.isEmpty())
+        processEvent(forEveryNode, none, event, childType, child, changesAtStart);
 }
 
-void Zel_EventCB::processEvent(const Zel_EventListenerSPList& listeners, const QString& key,
-                               const boost::shared_ptr<Zel_Event>& event, std::uint64_t changesAtStart)
+void Zel_EventCB::processEvent(const QList<boost::shared_ptr<Zel_EventListener>>& listeners, const QString& key,
+                               const boost::shared_ptr<Zel_Event>& event, unsigned long childType,
+                               const boost::shared_ptr<QString>* child, std::uint64_t changesAtStart)
 {
     for (const boost::shared_ptr<Zel_EventListener>& entry : listeners) {
-        if (!entry)
+        Zel_EventListener* const listener = entry.get();
+        if (!listener)
             continue;
         // Skip a listener that was unregistered during this delivery.
         if (mChanges != changesAtStart && !isFiled(key, entry))
             continue;
         // The snapshot keeps the listener alive through its call.
         try {
-            entry->handleEvent(event);
+            // A folder facade's own listener, whose class no one derives
+            // from: its handleEvent would test the mask and call the facade,
+            // and so does this, without copying the event for the call.
+            if (childType && &typeid(*listener) == &typeid(Zel_EventListenerFolderImpl)) {
+                if (childType & listener->mEnabledMask.load(std::memory_order_relaxed))
+                    static_cast<Zel_EventListenerFolderImpl*>(listener)->notify(childType, listener->mMoniker, *child);
+            } else {
+                listener->handleEvent(event);
+            }
         } catch (...) {
             // One listener's failure must not keep the event from the others.
             // The unwinding of a thread that is cancelled or calls pthread_exit

@@ -5,6 +5,8 @@
 #include "Zel_EventChildRemoved.h"
 #include "Zel_EventChildUpdated.h"
 
+#include <typeinfo>
+
 Zel_EventListenerFolder::Zel_EventListenerFolder(boost::shared_ptr<QString> moniker)
     : Zel_EventListener(std::move(moniker), 0, boost::shared_ptr<Zel_Session>())
 {
@@ -28,6 +30,21 @@ void Zel_EventListenerFolder::childUpdated(boost::shared_ptr<QString>, boost::sh
 {
 }
 
+namespace {
+
+// The event as the child event class of its type code, or null when it is of
+// another class. The exact class is recognised by its type_info (cheap); a
+// class derived from it needs the dynamic_cast.
+template <class ChildEvent>
+ChildEvent* asChildEvent(Zel_Event& event)
+{
+    if (&typeid(event) == &typeid(ChildEvent))
+        return static_cast<ChildEvent*>(&event);
+    return dynamic_cast<ChildEvent*>(&event);
+}
+
+} // namespace
+
 void Zel_EventListenerFolder::handleEvent(boost::shared_ptr<Zel_Event> event)
 {
     if (!event)
@@ -41,15 +58,15 @@ void Zel_EventListenerFolder::handleEvent(boost::shared_ptr<Zel_Event> event)
     Zel_IIEventListenerFolder& folder = *this;
     switch (type) {
     case 1:
-        if (Zel_EventChildAdded* added = dynamic_cast<Zel_EventChildAdded*>(event.get()))
+        if (Zel_EventChildAdded* added = asChildEvent<Zel_EventChildAdded>(*event))
             folder.childAdded(getMoniker(), added->getChildMoniker());
         break;
     case 2:
-        if (Zel_EventChildRemoved* removed = dynamic_cast<Zel_EventChildRemoved*>(event.get()))
+        if (Zel_EventChildRemoved* removed = asChildEvent<Zel_EventChildRemoved>(*event))
             folder.childRemoved(getMoniker(), removed->getChildMoniker());
         break;
     case 4:
-        if (Zel_EventChildUpdated* updated = dynamic_cast<Zel_EventChildUpdated*>(event.get()))
+        if (Zel_EventChildUpdated* updated = asChildEvent<Zel_EventChildUpdated>(*event))
             folder.childUpdated(getMoniker(), updated->getChildMoniker());
         break;
     default:

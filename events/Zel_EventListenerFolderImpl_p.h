@@ -13,6 +13,7 @@
 #define ZEL_EVENTLISTENERFOLDERIMPL_P_H
 
 #include "Zel_EventListenerFolder.h"
+#include "Zel_IEventListenerFolder.h"
 
 #include <QString>
 #include <boost/shared_ptr.hpp>
@@ -43,6 +44,30 @@ public:
     // own listener on the delivering thread. Without a live hub nothing can
     // deliver to this listener, and nothing is done.
     void detach(bool forgetFacade);
+
+    // What handleEvent does once it has found the event's type (1, 2 or 4)
+    // enabled and read the child: one call to the facade, if there still is
+    // one. The hub calls this for the library's own child events; it holds
+    // its lock, under which the facade pointer is cleared.
+    void notify(unsigned long type, const boost::shared_ptr<QString>& parent, const boost::shared_ptr<QString>& child)
+    {
+        Zel_IEventListenerFolder* const facade = mFacade;
+        if (!facade)
+            return;
+        switch (type) {
+        case 1:
+            facade->childAdded(parent, child);
+            break;
+        case 2:
+            facade->childRemoved(parent, child);
+            break;
+        case 4:
+            facade->childUpdated(parent, child);
+            break;
+        default:
+            break;
+        }
+    }
 
 private:
     Zel_EventListenerFolderImpl(const Zel_EventListenerFolderImpl&) = delete;

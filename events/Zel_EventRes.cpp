@@ -23,7 +23,7 @@ bool Zel_EventRes::deliverNext()
     if (!mHub)
         return false;
     try {
-        mHub->handleEvent(mEvent);
+        mHub->deliver(mEvent);
     } catch (...) {
         // Delivery problems stay here; the engine goes on with the next result.
         // The unwinding of a thread that is cancelled or calls pthread_exit

@@ -34,6 +34,9 @@ protected:
     explicit Zel_Event(boost::shared_ptr<QString> moniker);
 
 private:
+    // The hub reads the moniker of the library's own events without a copy.
+    friend class Zel_EventCB;
+
     Zel_Event& operator=(const Zel_Event&) = delete;
 
     boost::shared_ptr<QString> mMoniker;

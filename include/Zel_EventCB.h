@@ -27,6 +27,12 @@
 //
 // The hub holds its listeners strongly; sessions, node listeners and event
 // results hold the hub, which may therefore outlive its session.
+//
+// Speed: the table is hashed, so delivery costs the same however many
+// monikers are filed. The library's own child events reach the library's own
+// folder listeners (those of Zel_IEventListenerFolder) without the generic
+// handleEvent call; both are recognised by their exact class, so a class
+// derived from either still has every one of its overrides called.
 #ifndef ZEL_EVENTCB_H
 #define ZEL_EVENTCB_H
 
@@ -35,7 +41,7 @@
 #include "Threads_Mutex.h"
 #include "Zel_EventListenerSPList.h"
 
-#include <QMap>
+#include <QHash>
 #include <QString>
 #include <boost/shared_ptr.hpp>
 
@@ -70,16 +76,21 @@ private:
     // Takes itself out of the hub under the hub's lock (folder facades).
     friend class Zel_EventListenerFolderImpl;
 
-    typedef QMap<QString, Zel_EventListenerSPList> Table;
+    typedef QHash<QString, Zel_EventListenerSPList> Table;
 
     Zel_EventCB();
     Zel_EventCB(const Zel_EventCB&) = delete;
     Zel_EventCB& operator=(const Zel_EventCB&) = delete;
 
     static QString getMonikerString(const boost::shared_ptr<QString>& moniker);
+    // handleEvent without copying the event pointer (event results call it).
+    void deliver(const boost::shared_ptr<Zel_Event>& event);
     // Calls each listener of the snapshot that is still filed under the key.
-    void processEvent(const Zel_EventListenerSPList& listeners, const QString& key,
-                      const boost::shared_ptr<Zel_Event>& event, std::uint64_t changesAtStart);
+    // childType and child describe the library's own child events (0 and
+    // null for any other event), which its folder listeners take directly.
+    void processEvent(const QList<boost::shared_ptr<Zel_EventListener>>& listeners, const QString& key,
+                      const boost::shared_ptr<Zel_Event>& event, unsigned long childType,
+                      const boost::shared_ptr<QString>* child, std::uint64_t changesAtStart);
     bool isFiled(const QString& key, const boost::shared_ptr<Zel_EventListener>& listener) const;
 
     Threads::Mutex mMutex;

@@ -30,6 +30,9 @@ public:
     virtual boost::shared_ptr<QString> getChildMoniker();
 
 private:
+    // The hub reads the child of this exact class without a copy.
+    friend class Zel_EventCB;
+
     Zel_EventChildUpdated& operator=(const Zel_EventChildUpdated&) = delete;
 
     boost::shared_ptr<QString> mChildMoniker;

@@ -114,6 +114,38 @@ TEST_F(Zel_EventCBTest, NullListenerAndNullEventAreIgnoredAndDisabledTypesAreSti
                                         "all:Zel_EventChildAdded parent: A child: c"}));
 }
 
+TEST_F(Zel_EventCBTest, ManyFoldersEachHearOnlyTheirOwnEventsAndKeysDifferingInCaseStayApart)
+{
+    // Enough keys for the table to grow several times while listeners are filed.
+    std::vector<boost::shared_ptr<RecordingListener>> made;
+    for (int i = 0; i < 3000; ++i) {
+        const QByteArray key = QStringLiteral("/Show/Bin %1").arg(i).toLatin1();
+        made.push_back(listener(QByteArray("f" + QByteArray::number(i)).constData(), key.constData()));
+        session->RegisterListener(made.back());
+        if (i % 1000 == 7) {
+            made.push_back(listener(QByteArray("lower" + QByteArray::number(i)).constData(),
+                                    key.toLower().constData()));
+            session->RegisterListener(made.back());
+        }
+    }
+    for (int i : {0, 7, 1007, 2999}) {
+        const QByteArray key = QStringLiteral("/Show/Bin %1").arg(i).toLatin1();
+        deliver(hub, addedEvent(key.constData(), "c"));
+        EXPECT_EQ(names(), QStringList({QStringLiteral("f%1").arg(i)}));
+        deliver(hub, addedEvent(key.toLower().constData(), "c"));
+        EXPECT_EQ(names(), i % 1000 == 7 ? QStringList({QStringLiteral("lower%1").arg(i)}) : QStringList());
+    }
+    deliver(hub, addedEvent("/Show/Bin 3000", "c"));
+    EXPECT_TRUE(names().isEmpty());
+
+    // Unregistering and registering again among them changes only that key.
+    session->UnregisterListener(made[1]);
+    session->RegisterListener(listener("again", "/Show/Bin 1"));
+    deliver(hub, addedEvent("/Show/Bin 1", "c"));
+    deliver(hub, addedEvent("/Show/Bin 2", "c"));
+    EXPECT_EQ(names(), QStringList({"again", "f2"}));
+}
+
 TEST_F(Zel_EventCBTest, AThrowingListenerDoesNotStopDeliveryToTheOthers)
 {
     const auto made = registered({{"a1", "A"}, {"thrower", "A"}, {"a2", "A"}, {"allThrower", ""}, {"all", ""}});

@@ -7,8 +7,10 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <stdexcept>
 #include <type_traits>
 #include <utility>
+#include <vector>
 
 namespace {
 
@@ -315,6 +317,136 @@ TEST_F(Zel_IEventListenerFolderTest, AFacadeMayDestroyItselfOrAnotherFromItsOwnN
     deliver(hub, addedEvent("/s", "d"));
     EXPECT_EQ(log.lines(), QStringList({"first added /s c", "third added /s c", "third added /s d"}));
     EXPECT_EQ(key.use_count(), 2) << "only the test and the third's listener hold the moniker";
+}
+
+namespace {
+
+// A child-added event of the application's own class: the folder listeners
+// must read it through its overrides.
+struct RenamedAddedEvent : Zel_EventChildAdded {
+    RenamedAddedEvent() : Zel_EventChildAdded(moniker("/elsewhere"), moniker("stored")) {}
+    const boost::shared_ptr<QString> getMonikerSP() const override { return moniker("/bin"); }
+    boost::shared_ptr<QString> getChildMoniker() override { return moniker("overridden"); }
+};
+
+// A child-added event class that reports another type code.
+struct RetypedAddedEvent : Zel_EventChildAdded {
+    explicit RetypedAddedEvent(unsigned long type) : Zel_EventChildAdded(moniker("/bin"), moniker("c")), mType(type) {}
+    const unsigned long getEventType() const override { return mType; }
+    unsigned long mType;
+};
+
+// A folder listener of the application's own kind that accepts every type
+// whatever its mask says.
+struct EagerFolderListener : DirectFolderListener {
+    using DirectFolderListener::DirectFolderListener;
+    bool isEnabled(boost::shared_ptr<Zel_Event> event) const override { return event != nullptr; }
+};
+
+} // namespace
+
+TEST_F(Zel_IEventListenerFolderTest, EventsOfOtherClassesAreReadThroughTheirOverridesOrMakeNoCall)
+{
+    FolderWatch watch(&log, "w", moniker("/bin"), 7, session);
+
+    // A class derived from a child event: filed by its getMonikerSP, child
+    // from its getChildMoniker.
+    deliver(hub, boost::shared_ptr<Zel_Event>(new RenamedAddedEvent));
+    EXPECT_EQ(log.lines(), QStringList({"w added /bin overridden"}));
+
+    // Other classes that carry a child code, and a child-added class that
+    // reports the code of another child event, make no call.
+    log.clear();
+    for (unsigned long type : {1ul, 2ul, 4ul}) {
+        struct BinEvent : Zel_Event {
+            explicit BinEvent(unsigned long type) : Zel_Event(moniker("/bin")), mType(type) {}
+            const unsigned long getEventType() const override { return mType; }
+            unsigned long mType;
+        };
+        deliver(hub, boost::shared_ptr<Zel_Event>(new BinEvent(type)));
+    }
+    deliver(hub, boost::shared_ptr<Zel_Event>(new RetypedAddedEvent(2)));
+    deliver(hub, boost::shared_ptr<Zel_Event>(new RetypedAddedEvent(4)));
+    EXPECT_TRUE(log.lines().isEmpty());
+    // With its own code again, it is a child-added event.
+    deliver(hub, boost::shared_ptr<Zel_Event>(new RetypedAddedEvent(1)));
+    EXPECT_EQ(log.lines(), QStringList({"w added /bin c"}));
+}
+
+TEST_F(Zel_IEventListenerFolderTest, FolderListenersOfTheApplicationKeepTheirOverridesInTheHub)
+{
+    // Mask 0, but its isEnabled accepts everything; a facade with mask 0
+    // beside it hears nothing.
+    const boost::shared_ptr<EagerFolderListener> eager(new EagerFolderListener(&log, "eager", moniker("/bin")));
+    session->RegisterListener(eager);
+    FolderWatch quiet(&log, "quiet", moniker("/bin"), 0, session);
+    deliver(hub, addedEvent("/bin", "a"));
+    deliver(hub, removedEvent("/bin", "b"));
+    EXPECT_EQ(log.lines(), QStringList({"eager added /bin a", "eager removed /bin b"}));
+}
+
+TEST_F(Zel_IEventListenerFolderTest, FacadesAndOtherListenersAreCalledInOrderAndAThrowingFacadeStopsNoOne)
+{
+    struct ThrowingWatch : FolderWatch {
+        using FolderWatch::FolderWatch;
+        void childUpdated(boost::shared_ptr<QString> p, boost::shared_ptr<QString> c) override
+        {
+            FolderWatch::childUpdated(p, c);
+            throw std::runtime_error("facade failed");
+        }
+    };
+    FolderWatch first(&log, "first", moniker("/bin"), 7, session);
+    const boost::shared_ptr<RecordingListener> plain(new RecordingListener(&log, "plain", moniker("/bin")));
+    session->RegisterListener(plain);
+    ThrowingWatch thrower(&log, "thrower", moniker("/bin"), 7, session);
+    FolderWatch every(&log, "every", boost::shared_ptr<QString>(), 7, session);
+    FolderWatch last(&log, "last", moniker("/bin"), 7, session);
+
+    deliver(hub, updatedEvent("/bin", "c"));
+    deliver(hub, boost::shared_ptr<Zel_Event>(new Zel_EventChildUpdated(moniker("/bin"), boost::shared_ptr<QString>())));
+    EXPECT_EQ(log.lines(), QStringList({"first updated /bin c", "plain:Zel_EventChildUpdated parent: /bin child: c",
+                                        "thrower updated /bin c", "last updated /bin c", "every updated <null> c",
+                                        "first updated /bin <null>",
+                                        "plain:Zel_EventChildUpdated parent: /bin child: ",
+                                        "thrower updated /bin <null>", "last updated /bin <null>",
+                                        "every updated <null> <null>"}));
+}
+
+TEST_F(Zel_IEventListenerFolderTest, HandsTheFacadeItsMonikersWithoutKeepingCopiesOfTheirsOrOfTheEvent)
+{
+    // Inside the notification the monikers are held by their owners and by
+    // the by-value parameters only, and the event by the test and its result:
+    // delivery to a facade copies nothing else.
+    struct CountingWatch : Zel_IEventListenerFolder {
+        CountingWatch(boost::shared_ptr<QString> key, boost::shared_ptr<Zel_Session> s)
+            : Zel_IEventListenerFolder(std::move(key), 7, std::move(s))
+        {
+        }
+        void childAdded(boost::shared_ptr<QString> p, boost::shared_ptr<QString> c) override { record(p, c); }
+        void childRemoved(boost::shared_ptr<QString> p, boost::shared_ptr<QString> c) override { record(p, c); }
+        void childUpdated(boost::shared_ptr<QString> p, boost::shared_ptr<QString> c) override { record(p, c); }
+        void record(const boost::shared_ptr<QString>& p, const boost::shared_ptr<QString>& c)
+        {
+            counts.push_back({p.use_count(), c.use_count(), event->use_count()});
+        }
+        const boost::shared_ptr<Zel_Event>* event = nullptr;
+        std::vector<std::vector<long>> counts;
+    };
+    const boost::shared_ptr<QString> parent = moniker("/bin");
+    const boost::shared_ptr<QString> child = moniker("c");
+    CountingWatch watch(parent, session);
+    const boost::shared_ptr<Zel_Event> events[] = {
+        boost::shared_ptr<Zel_Event>(new Zel_EventChildAdded(parent, child)),
+        boost::shared_ptr<Zel_Event>(new Zel_EventChildRemoved(parent, child)),
+        boost::shared_ptr<Zel_Event>(new Zel_EventChildUpdated(parent, child))};
+    for (const boost::shared_ptr<Zel_Event>& event : events) {
+        watch.event = &event;
+        deliver(hub, event);
+    }
+    // parent: this test, the listener, the three events, the parameter;
+    // child: this test, the three events, the parameter; event: this test, the result.
+    const std::vector<long> expected = {6, 5, 2};
+    EXPECT_EQ(watch.counts, std::vector<std::vector<long>>(3, expected));
 }
 
 TEST(Zel_IEventListenerFolderSlotTest, SlotOrderAndCopyRules)
