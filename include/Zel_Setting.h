@@ -32,6 +32,9 @@ public:
     operator QString() const;
 
 private:
+    // The list reads the fields in place while it writes its XML form.
+    friend class Zel_SettingList;
+
     QString mKey;
     QString mValue;
 };

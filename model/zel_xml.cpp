@@ -144,7 +144,7 @@ bool isXmlChar(const QString& text, int i, int& length)
 
 namespace ZelXml {
 
-bool isValidName(const QString& name)
+bool isValidName(QStringView name)
 {
     if (name.isEmpty() || !isNameStartChar(name.at(0)))
         return false;
@@ -173,6 +173,64 @@ QString xmlCharsOnly(const QString& text)
         i += length;
     }
     return kept;
+}
+
+QChar* writeElementText(QStringView text, QChar* out)
+{
+    const auto put = [&out](const char* reference) {
+        while (*reference)
+            *out++ = QLatin1Char(*reference++);
+    };
+    const QChar* const data = text.data();
+    const qsizetype size = text.size();
+    // How many ']' the kept text ends in (up to two): "]]>" must not appear.
+    int brackets = 0;
+    for (qsizetype i = 0; i < size; ++i) {
+        const QChar c = data[i];
+        const ushort u = c.unicode();
+        if (u > '>' && u < 0xD800 && u != ']') {
+            *out++ = c;
+            brackets = 0;
+            continue;
+        }
+        if (u == ']') {
+            *out++ = c;
+            brackets = brackets < 2 ? brackets + 1 : 2;
+            continue;
+        }
+        if (u < 0x20) {
+            if (u == 0xD)
+                put("&#xd;");
+            else if (u == 0x9 || u == 0xA)
+                *out++ = c;
+            else
+                continue; // a control character: left out
+        } else if (u == '<') {
+            put("&lt;");
+        } else if (u == '&') {
+            put("&amp;");
+        } else if (u == '>') {
+            if (brackets == 2)
+                put("&gt;");
+            else
+                *out++ = c;
+        } else if (u < 0xD800) {
+            *out++ = c;
+        } else if (u <= 0xDBFF) {
+            if (i + 1 < size && data[i + 1].isLowSurrogate()) {
+                *out++ = c;
+                *out++ = data[++i];
+            } else {
+                continue; // a high surrogate without its low half: left out
+            }
+        } else if (u <= 0xDFFF || u == 0xFFFE || u == 0xFFFF) {
+            continue; // a low surrogate alone, or a non-character: left out
+        } else {
+            *out++ = c;
+        }
+        brackets = 0;
+    }
+    return out;
 }
 
 } // namespace ZelXml
