@@ -1,28 +1,43 @@
-// Node ordering: std::sort of 10,000 nodes with Zel_Node::operator<, against
-// sorting the same (mime type rank, name) pairs with plain QString comparisons.
+// Node ordering: std::sort of 100,000 nodes with Zel_Node::operator<, and
+// Zel_NodeList::sortByOrder of the same nodes, against sorting the same nodes
+// by keys read from them once, and against sorting bare (mime type rank,
+// name) pairs.
 //
 // The nodes look like a large folder listing: mostly master clips, then
 // sequences, subclips, bins, folders and a few other types; names such as
 // "Interview 0042", "b-roll Take 7", "Café Scene 12 Shot 3" in mixed case,
 // with exact duplicates (told apart by moniker). The "mixed" set replaces
 // about one name in ten by a non-Latin-1 one (Cyrillic, Greek, Polish,
-// Japanese), which takes the slower toLower() path of the comparison.
+// Japanese).
 //
 // Rows (per set: latin1, mixed):
-//   order/<set>/Zel_Node-operator</10000     std::sort(nodes, *a < *b), nodes behind
-//                                            boost::shared_ptr<Zel_Node>
-//   order/<set>/toLower-per-compare/10000    peer: sort of (rank, name) pairs comparing
-//                                            a.name.toLower() < b.name.toLower()
-//   order/<set>/prelowered-keys/10000        floor: sort of (rank, lowered name) pairs,
-//                                            lowered once before the sort
-//   order/<set>/getters+plain-compare/10000  floor of the node interface: the same nodes
-//                                            sorted by getMimeType() then getName() with
-//                                            plain QString <, i.e. the four virtual calls
-//                                            and QString copies every comparison must make
+//   order/<set>/Zel_Node-operator</100000     std::sort(nodes, *a < *b), nodes behind
+//                                             boost::shared_ptr<Zel_Node>
+//   order/<set>/sortByOrder/100000            Zel_NodeList::sortByOrder of the same nodes:
+//                                             reading the keys, sorting, placing the nodes
+//   order/<set>/toLower-per-compare/100000    peer: sort of (rank, name) pairs comparing
+//                                             a.name.toLower() < b.name.toLower()
+//   order/<set>/precomputed-keys/100000       peer: what a user writes instead of operator<:
+//                                             each node's key (rank, lowered name, name,
+//                                             moniker) read once through the getters, the
+//                                             (key, node) pairs sorted, the nodes put back
+//   order/<set>/prelowered-keys/100000        floor: the sort alone of (rank, lowered name)
+//                                             pairs made before the timing starts
+//   order/<set>/getters+plain-compare/100000  floor of the node interface: the same nodes
+//                                             sorted by getMimeType() then getName() with
+//                                             plain QString <, i.e. the virtual calls and
+//                                             QString copies every comparison must make
+//
+// Targets (per set): operator< at most 3x the precomputed-key peer;
+// sortByOrder at most 1.3x it. operator< must make the virtual calls and
+// QString copies of the getters floor on every comparison; sortByOrder reads
+// the nodes once and then sorts keys of its own. The prelowered-keys floor,
+// which never touches a node, is reported beside them.
 #include "BenchSupport.h"
 
 #include "Zel_MimeTypeSpec.h"
 #include "Zel_Node.h"
+#include "Zel_NodeList.h"
 
 #include <QString>
 #include <QStringList>
@@ -37,7 +52,7 @@
 
 namespace {
 
-const int kNodes = 10000;
+const int kNodes = zelbench::size(100000, 1000);
 
 // A backend's node in its simplest form: name and mime type held in memory.
 class ListedNode : public Zel_Node
@@ -80,6 +95,7 @@ private:
 struct Listing
 {
     std::vector<boost::shared_ptr<Zel_Node>> nodes;
+    Zel_NodeList list;
     std::vector<QString> names;
     std::vector<long> ranks;
 };
@@ -140,6 +156,7 @@ Listing makeListing(bool withNonLatin1)
         const QString name = withNonLatin1 && random.below(10) == 0 ? otherNameFor(random) : latin1NameFor(random);
         listing.nodes.push_back(boost::make_shared<ListedNode>(
             QStringLiteral("zel://server/asset/%1").arg(i), name, mimeType));
+        listing.list.append(listing.nodes.back());
         listing.names.push_back(name);
         listing.ranks.push_back(Zel_MimeTypeSpec::getSortOrder(mimeType));
     }
@@ -168,12 +185,26 @@ void check(bool condition, const char* what)
     }
 }
 
+// The nodes agree with the peer's order on rank and lowered name.
+template <class Nodes>
+void checkOrder(const Nodes& nodes)
+{
+    for (int i = 1; i < static_cast<int>(nodes.size()); ++i) {
+        const long rankA = Zel_MimeTypeSpec::getSortOrder(nodes[i - 1]->getMimeType());
+        const long rankB = Zel_MimeTypeSpec::getSortOrder(nodes[i]->getMimeType());
+        check(rankA < rankB || (rankA == rankB && nodes[i - 1]->getName().toLower() <= nodes[i]->getName().toLower()),
+              "nodes out of order");
+    }
+}
+
 void registerRows(const char* set, bool withNonLatin1)
 {
     const std::string stem = std::string("order/") + set + "/";
     const std::string size = "/" + std::to_string(kNodes);
     const std::string feature = stem + "Zel_Node-operator<" + size;
+    const std::string sortByOrder = stem + "sortByOrder" + size;
     const std::string peer = stem + "toLower-per-compare" + size;
+    const std::string keyed = stem + "precomputed-keys" + size;
     const std::string floor = stem + "prelowered-keys" + size;
     const std::string gettersFloor = stem + "getters+plain-compare" + size;
 
@@ -187,13 +218,19 @@ void registerRows(const char* set, bool withNonLatin1)
             std::sort(nodes.begin(), nodes.end(),
                       [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
         }
-        // The order agrees with the peer's on rank and lowered name.
-        for (std::size_t i = 1; i < nodes.size(); ++i) {
-            const long rankA = Zel_MimeTypeSpec::getSortOrder(nodes[i - 1]->getMimeType());
-            const long rankB = Zel_MimeTypeSpec::getSortOrder(nodes[i]->getMimeType());
-            check(rankA < rankB || (rankA == rankB && nodes[i - 1]->getName().toLower() <= nodes[i]->getName().toLower()),
-                  "nodes out of order");
+        checkOrder(nodes);
+    });
+    zelbench::row(sortByOrder, kNodes, [withNonLatin1](benchmark::State& state) {
+        const Listing listing = makeListing(withNonLatin1);
+        Zel_NodeList nodes;
+        for (auto _ : state) {
+            state.PauseTiming();
+            nodes = listing.list;
+            nodes.detach();
+            state.ResumeTiming();
+            nodes.sortByOrder();
         }
+        checkOrder(nodes);
     });
     zelbench::row(peer, kNodes, [withNonLatin1](benchmark::State& state) {
         const std::vector<RankedName> unsorted = rankedNames(makeListing(withNonLatin1), false);
@@ -208,6 +245,43 @@ void registerRows(const char* set, bool withNonLatin1)
                 return a.name.toLower() < b.name.toLower();
             });
         }
+    });
+    zelbench::row(keyed, kNodes, [withNonLatin1](benchmark::State& state) {
+        struct Keyed
+        {
+            long rank;
+            QString lowered;
+            QString name;
+            QString moniker;
+            boost::shared_ptr<Zel_Node> node;
+        };
+        const Listing listing = makeListing(withNonLatin1);
+        std::vector<boost::shared_ptr<Zel_Node>> nodes;
+        std::vector<Keyed> keys;
+        for (auto _ : state) {
+            state.PauseTiming();
+            nodes = listing.nodes;
+            keys.clear();
+            state.ResumeTiming();
+            keys.reserve(nodes.size());
+            for (boost::shared_ptr<Zel_Node>& node : nodes) {
+                const QString name = node->getName();
+                keys.push_back(Keyed{Zel_MimeTypeSpec::getSortOrder(node->getMimeType()), name.toLower(), name,
+                                     node->getMoniker(), std::move(node)});
+            }
+            std::sort(keys.begin(), keys.end(), [](const Keyed& a, const Keyed& b) {
+                if (a.rank != b.rank)
+                    return a.rank < b.rank;
+                if (a.lowered != b.lowered)
+                    return a.lowered < b.lowered;
+                if (a.name != b.name)
+                    return a.name < b.name;
+                return a.moniker < b.moniker;
+            });
+            for (std::size_t i = 0; i < keys.size(); ++i)
+                nodes[i] = std::move(keys[i].node);
+        }
+        checkOrder(nodes);
     });
     zelbench::row(floor, kNodes, [withNonLatin1](benchmark::State& state) {
         const std::vector<RankedName> unsorted = rankedNames(makeListing(withNonLatin1), true);
@@ -239,8 +313,11 @@ void registerRows(const char* set, bool withNonLatin1)
             });
         }
     });
-    zelbench::compare(feature, peer, "peer");
+    zelbench::target(std::string("node order: operator< sort, ") + set, feature, keyed, "peer", 3.0);
+    zelbench::target(std::string("node order: sortByOrder, ") + set, sortByOrder, keyed, "peer", 1.3);
     zelbench::compare(feature, floor, "floor");
+    zelbench::compare(sortByOrder, floor, "floor");
+    zelbench::compare(feature, peer, "peer");
     zelbench::compare(feature, gettersFloor, "floor");
 }
 

@@ -6,8 +6,12 @@
 #include <QtGlobal>
 #include <QDateTime>
 #include <QElapsedTimer>
+#include <QHash>
 #include <QLocale>
+#include <QStringView>
 #include <QRegExp> // Qt 6: from the Core5Compat module
+
+#include <cstddef>
 
 namespace ZelCompat {
 
@@ -44,6 +48,28 @@ inline QString systemTextDate(const QDateTime& local)
         + QString::number(date.year());
 #else
     return local.toString(Qt::TextDate);
+#endif
+}
+
+// The process's seed of Qt's hash functions, as QHash uses it (random unless
+// QT_HASH_SEED fixes it), so that hashed lookups cannot be flooded with
+// colliding names.
+inline std::size_t hashSeed()
+{
+#if QT_VERSION_MAJOR >= 6
+    return QHashSeed::globalSeed();
+#else
+    return static_cast<uint>(qGlobalQHashSeed());
+#endif
+}
+
+// Qt's hash of a text with a seed from hashSeed().
+inline uint hashText(QStringView text, std::size_t seed)
+{
+#if QT_VERSION_MAJOR >= 6
+    return static_cast<uint>(qHash(text, seed));
+#else
+    return qHash(text, static_cast<uint>(seed));
 #endif
 }
 

@@ -32,5 +32,6 @@ set(ZEL_MODEL_SOURCES
   Zel_Setting.cpp
   Zel_SettingList.cpp
   zel_xml.cpp
+  zel_nodeorder_p.h
   zel_xml_p.h
 )

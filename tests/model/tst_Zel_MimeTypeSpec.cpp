@@ -67,8 +67,13 @@ TEST(Zel_MimeTypeSpecTest, UnknownNamesAndValuesFindNothing)
     EXPECT_FALSE(Zel_MimeTypeSpec::getType(QString(), value) || Zel_MimeTypeSpec::getType(QStringLiteral("asset"), value));
     EXPECT_EQ(value, Zel_MimeType_Bin);
 
-    for (const QString& name : {QStringLiteral("Sequence"), QStringLiteral("asset"), QString(), QStringLiteral("sequence ")})
+    // Lookups go by length, then unit by unit: a name one longer than the
+    // longest, a unit whose low byte is 'b' (U+0162), an embedded NUL.
+    for (const QString& name : {QStringLiteral("Sequence"), QStringLiteral("asset"), QString(), QStringLiteral("sequence "),
+                                QStringLiteral("stereomasterclips"), QString(QChar(0x162)) + QStringLiteral("in"),
+                                QStringLiteral("bin") + QChar(0) + QStringLiteral("x"), QStringLiteral("bi")})
         EXPECT_EQ(Zel_MimeTypeSpec::getSortOrder(name), 28) << name.toStdString();
+    EXPECT_FALSE(Zel_MimeTypeSpec(0xFFFFFFFFu).isType(QString(QChar(0x162)) + QStringLiteral("in")));
     for (quint32 bits : {0x3u, 0u, 0x200000u, 0x80000000u})
         EXPECT_TRUE(Zel_MimeTypeSpec::getString(v(bits)).isNull()) << bits;
 }

@@ -3,12 +3,14 @@
 #include "Zel_MimeTypeSpec.h"
 #include "Zel_Node.h"
 #include "Zel_NodeList.h"
+#include "zel_nodeorder_p.h"
 
 #include <boost/make_shared.hpp>
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cstdint>
 #include <random>
 #include <string>
 #include <tuple>
@@ -74,9 +76,18 @@ bool referenceLess(TestNode& a, TestNode& b)
     return key(a, na) < key(b, nb);
 }
 
+// One UTF-16 unit, paired or not.
+QString unit(ushort value)
+{
+    return QString(QChar(value));
+}
+
 // Characters whose case behaviour differs between toLower(), case folding and
 // ASCII: µ, ſ, final and capital sigma, dotted and dotless i, the Kelvin
-// sign, Ÿ (lowers into Latin-1), À/à, ×, Þ, ß and capital ẞ, a Deseret pair.
+// sign, Ÿ (lowers into Latin-1), À/à, ×, Þ, ß and capital ẞ, a Deseret pair;
+// and broken UTF-16, which Qt lowers by rules of its own: unpaired high and
+// low surrogates (Deseret halves, which may meet to make a pair) and U+FFFD,
+// which Qt 6 puts in their place.
 const std::vector<QString>& namePieces()
 {
     static const std::vector<QString> pieces = {
@@ -84,6 +95,7 @@ const std::vector<QString>& namePieces()
         u("µ"), u("Μ"), u("μ"), u("ſ"), u("ς"), u("σ"), u("Σ"), u("İ"), u("ı"), u("\u212A"),
         u("Ÿ"), u("ÿ"), u("À"), u("à"), u("×"), u("÷"), u("Þ"), u("þ"), u("ß"), u("ẞ"),
         u("\xF0\x90\x90\x80"), u("\xF0\x90\x90\xA8"),
+        unit(0xD801), unit(0xDC00), unit(0xDC28), u("\xEF\xBF\xBD"),
     };
     return pieces;
 }
@@ -107,6 +119,48 @@ std::vector<NodeSP> randomNodes(std::mt19937& random, int count)
         nodes.push_back(node(mimes[mime(random)], name, monikers[moniker(random)]));
     }
     return nodes;
+}
+
+// Names long enough for the comparison's word-at-a-time paths: stems shared
+// by many names, every Latin-1 unit (NUL included), case changed anywhere,
+// units replaced, pieces and unpaired surrogates inserted into shared
+// stretches, names cut short.
+std::vector<QString> longNames(std::mt19937& random, int count)
+{
+    std::uniform_int_distribution<int> roll(0, 99), latin1(0, 0xFF);
+    std::uniform_int_distribution<std::size_t> piece(0, namePieces().size() - 1);
+    std::vector<QString> names;
+    for (int i = 0; i < count; ++i) {
+        QString name;
+        if (!names.empty() && roll(random) < 75) {
+            name = names[std::uniform_int_distribution<std::size_t>(0, names.size() - 1)(random)];
+            for (int edits = 1 + roll(random) % 3; edits > 0; --edits) {
+                const int kind = roll(random);
+                const int at = name.isEmpty() ? 0 : std::uniform_int_distribution<int>(0, name.size() - 1)(random);
+                if (kind < 40 && !name.isEmpty()) {
+                    const QChar c = name.at(at);
+                    name[at] = c.isUpper() ? c.toLower() : c.toUpper();
+                } else if (kind < 60) {
+                    name += namePieces()[piece(random)];
+                } else if (kind < 75 && !name.isEmpty()) {
+                    name[at] = QChar(static_cast<ushort>(latin1(random)));
+                } else if (kind < 90) {
+                    name.insert(at, namePieces()[piece(random)]);
+                } else {
+                    name.truncate(at);
+                }
+            }
+        } else {
+            for (int n = roll(random) % 21; n > 0; --n) {
+                if (roll(random) < 85)
+                    name += QChar(static_cast<ushort>(latin1(random)));
+                else
+                    name += namePieces()[piece(random)];
+            }
+        }
+        names.push_back(name);
+    }
+    return names;
 }
 
 } // namespace
@@ -273,6 +327,113 @@ TEST(Zel_NodeTest, RandomNodesOrderExactlyAsTheReferenceOrderingAndSortCleanly)
     EXPECT_TRUE(std::is_sorted(sample.begin(), sample.end(), less));
 }
 
+TEST(Zel_NodeTest, LongNamesOrderExactlyAsTheReferenceOrdering)
+{
+    for (std::uint32_t seed : {7u, 8u, 9u}) {
+        std::mt19937 random(seed);
+        std::vector<TestNode> nodes;
+        int i = 0;
+        for (const QString& name : longNames(random, 300))
+            nodes.emplace_back(QStringLiteral("bin"), name, QString::fromLatin1(i++ % 3 ? "m" : ""));
+        for (TestNode& a : nodes)
+            for (TestNode& b : nodes)
+                ASSERT_EQ(a < b, referenceLess(a, b)) << "seed " << seed << ": " << a.getName().toStdString() << " vs "
+                                                      << b.getName().toStdString();
+    }
+}
+
+TEST(Zel_NodeTest, EveryPairOfLatin1UnitsOrdersAsTheReference)
+{
+    // Latin-1 names are lowered four units at a time: every pair of units,
+    // at each of the four places, in names that agree elsewhere.
+    for (int c = 0; c < 0x100; ++c) {
+        for (int d = 0; d < 0x100; ++d) {
+            const int place = (c + d) % 4;
+            const QString stem = QStringLiteral("Ab\u00C9").left(place);
+            TestNode a(QStringLiteral("bin"), stem + QChar(static_cast<ushort>(c)) + QStringLiteral("xY"), QString());
+            TestNode b(QStringLiteral("bin"), stem + QChar(static_cast<ushort>(d)) + QStringLiteral("xY"), QString());
+            ASSERT_EQ(a < b, referenceLess(a, b)) << std::hex << c << " " << d;
+        }
+    }
+}
+
+TEST(Zel_NodeTest, LoweringOneCodePointAtATimeMatchesToLower)
+{
+    // The ordering never builds a lowered name: it lowers code point by code
+    // point and relies on that giving exactly QString::toLower(), which it
+    // does for every code point, in one unit or two.
+    int mismatches = 0;
+    std::string first;
+    for (uint cp = 0; cp <= 0x10FFFF; ++cp) {
+        if (QChar::isSurrogate(cp))
+            continue;
+        QString text;
+        if (QChar::requiresSurrogates(cp)) {
+            text.append(QChar(QChar::highSurrogate(cp)));
+            text.append(QChar(QChar::lowSurrogate(cp)));
+        } else {
+            text.append(QChar(static_cast<ushort>(cp)));
+        }
+        const QString expected = text.toLower();
+        ushort units[2] = {0, 0};
+        const int count = ZelNodeOrder::lowerCodePoint(cp, units);
+        std::vector<ushort> appended;
+        ZelNodeOrder::appendLowered(text, appended);
+        const bool same = expected.size() == count && expected.at(0).unicode() == units[0]
+            && (count == 1 || expected.at(1).unicode() == units[1]);
+        const bool sameAppended = std::vector<ushort>(expected.utf16(), expected.utf16() + expected.size()) == appended;
+        if (!same || !sameAppended) {
+            if (mismatches++ == 0)
+                first = QString::number(cp, 16).toStdString();
+        }
+    }
+    EXPECT_EQ(mismatches, 0) << "first at U+" << first;
+
+    // Broken UTF-16 is lowered by Qt's rules for the whole text.
+    const std::vector<QString> broken = {
+        unit(0xD801), unit(0xDC28), unit(0xD801) + u("A"), u("A") + unit(0xD801), unit(0xDC00) + u("A"),
+        u("A") + unit(0xD800) + u("¶Z"), unit(0xD800) + u("¶"), u("xÀ") + unit(0xD801) + unit(0xDC00) + unit(0xD800) + u("Y"),
+        unit(0xD801) + unit(0xD801) + unit(0xDC00) + u("B"),
+    };
+    for (const QString& text : broken) {
+        const QString expected = text.toLower();
+        std::vector<ushort> appended;
+        appended.push_back('#'); // appends after what is there
+        ZelNodeOrder::appendLowered(text, appended);
+        std::vector<ushort> wanted(1, '#');
+        wanted.insert(wanted.end(), expected.utf16(), expected.utf16() + expected.size());
+        EXPECT_EQ(appended, wanted) << QString::number(text.at(0).unicode(), 16).toStdString();
+    }
+}
+
+TEST(Zel_NodeTest, BrokenUtf16OrdersByItsToLowerForm)
+{
+    // Qt lowers an unpaired surrogate by rules that look at the whole text
+    // (Qt 5 pairs it with the next unit, Qt 6 may replace it with U+FFFD),
+    // so these pairs order as their toLower() forms do, whatever those are;
+    // taking the surrogate for itself would get some of them wrong.
+    const std::vector<std::pair<QString, QString>> pairs = {
+        {u("A") + unit(0xD800) + u("x"), u("a") + unit(0xD800) + u("y")},
+        {unit(0xD800) + u("A"), unit(0xD800) + u("a")},
+        {unit(0xD800) + u("¶"), unit(0xD800) + u("\u24B6")},
+        {unit(0xD800) + u("A"), unit(0xD800) + u("[")}, // Qt 5 reads U+D800 and A as one, leaving A
+        // A case change before an unpaired surrogate in a stretch the two share.
+        {u("Abcd") + unit(0xD800) + u("xyz0"), u("abcd") + unit(0xD800) + u("xyz1")},
+        {u("Abcd") + unit(0xD800) + u("xyz1"), u("abcd") + unit(0xD800) + u("xyz0")},
+        {u("B") + unit(0xDC00), u("b") + u("\xEF\xBF\xBD")},
+        {u("b") + unit(0xD801), u("B") + unit(0xD801) + unit(0xDC00)},
+        {u("\xF0\x90\x90\x80") + u("A"), u("\xF0\x90\x90\xA8") + unit(0xDC00)},
+        {u("İ") + unit(0xD800), u("i\u0307") + unit(0xD800)},
+        {unit(0xD801), QString()},
+    };
+    for (const auto& pair : pairs) {
+        TestNode a(QStringLiteral("bin"), pair.first, QStringLiteral("m"));
+        TestNode b(QStringLiteral("bin"), pair.second, QStringLiteral("m"));
+        EXPECT_EQ(a < b, referenceLess(a, b)) << pair.first.size() << " " << pair.second.size();
+        EXPECT_EQ(b < a, referenceLess(b, a)) << pair.first.size() << " " << pair.second.size();
+    }
+}
+
 TEST(Zel_NodeTest, RelationsAreBuiltFromLessAndIdentity)
 {
     // Same node (equal IDs) with different names: equal and also ordered.
@@ -308,4 +469,122 @@ TEST(Zel_NodeTest, ColorFromNameIgnoresCase)
     // Latin-1 Ü folds to ü, not u.
     for (const char* unknown : {"red", "", "blu", "blue ", "zzz", "aaa", "bl\xDC" "e", "\xC0\xFF", (const char*)nullptr})
         EXPECT_EQ(Zel_Node::colorFromName(unknown), -1) << (unknown ? unknown : "null");
+}
+
+namespace {
+
+// Counts the reads of the three texts that order it.
+class CountingNode : public TestNode
+{
+public:
+    using TestNode::TestNode;
+    QString getName() override { ++names; return TestNode::getName(); }
+    QString getMimeType() override { ++mimeTypes; return TestNode::getMimeType(); }
+    QString getMoniker() override { ++monikers; return TestNode::getMoniker(); }
+    int names = 0;
+    int mimeTypes = 0;
+    int monikers = 0;
+};
+
+template <class Nodes>
+std::vector<const Zel_Node*> pointers(const Nodes& nodes)
+{
+    std::vector<const Zel_Node*> result;
+    for (const boost::shared_ptr<Zel_Node>& node : nodes)
+        result.push_back(node.get());
+    return result;
+}
+
+} // namespace
+
+TEST(Zel_NodeListTest, SortByOrderGivesTheOrderOfAStableSortWithLess)
+{
+    // Random sets of every size class: ties (equal kind, name and moniker,
+    // which must keep their order), case variants, non-Latin-1 and broken
+    // UTF-16 names, empty names and monikers, unknown and empty mime types.
+    const int sizes[] = {0, 1, 2, 3, 7, 40, 250, 1500};
+    for (std::uint32_t seed = 1; seed <= 48; ++seed) {
+        std::mt19937 random(seed);
+        const int count = sizes[seed % (sizeof sizes / sizeof sizes[0])];
+        std::vector<NodeSP> sample = randomNodes(random, count);
+        // Exact copies of earlier nodes, distinct objects.
+        std::uniform_int_distribution<int> copyOf(0, count > 0 ? count - 1 : 0);
+        for (int i = 0; i < count / 4; ++i) {
+            const NodeSP original = sample[copyOf(random)];
+            sample.push_back(boost::make_shared<TestNode>(original->getMimeType(), original->getName(), original->getMoniker()));
+        }
+        std::shuffle(sample.begin(), sample.end(), random);
+
+        Zel_NodeList list;
+        QList<boost::shared_ptr<Zel_Node>> plain;
+        for (const NodeSP& n : sample) {
+            list.append(n);
+            plain.append(n);
+        }
+        std::vector<boost::shared_ptr<Zel_Node>> expected(list.begin(), list.end());
+        std::stable_sort(expected.begin(), expected.end(),
+                         [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+        std::vector<const Zel_Node*> expectedPointers;
+        for (const boost::shared_ptr<Zel_Node>& n : expected)
+            expectedPointers.push_back(n.get());
+
+        const Zel_NodeList unsorted = list; // shares the items until sorted
+        list.sortByOrder();
+        ASSERT_EQ(pointers(list), expectedPointers) << "seed " << seed << ", " << sample.size() << " nodes";
+        Zel_NodeList::sortByOrder(plain);
+        ASSERT_EQ(pointers(plain), expectedPointers) << "seed " << seed;
+        std::vector<boost::shared_ptr<Zel_Node>> vector(sample.begin(), sample.end());
+        Zel_NodeList::sortByOrder(vector);
+        ASSERT_EQ(pointers(vector), expectedPointers) << "seed " << seed;
+        // The copy taken before is untouched.
+        std::vector<const Zel_Node*> before;
+        for (const NodeSP& n : sample)
+            before.push_back(n.get());
+        ASSERT_EQ(pointers(unsorted), before) << "seed " << seed;
+    }
+}
+
+TEST(Zel_NodeListTest, SortByOrderReadsEachNodeOnceAndPutsNullsLast)
+{
+    // Twenty nodes of four names in two cases and two kinds, every name
+    // twice with one moniker: many ties to break by name, moniker and place.
+    std::vector<boost::shared_ptr<CountingNode>> counted;
+    Zel_NodeList list;
+    for (int i = 0; i < 20; ++i) {
+        const QString name = QString::fromLatin1(i % 2 ? "Take " : "take ") + QString::number(i % 4);
+        counted.push_back(boost::make_shared<CountingNode>(QString::fromLatin1(i % 3 ? "clip" : "bin"), name,
+                                                           QString::fromLatin1(i % 5 ? "m" : "n")));
+        list.append(counted.back());
+        if (i % 6 == 0)
+            list.append(boost::shared_ptr<Zel_Node>());
+    }
+    std::vector<boost::shared_ptr<Zel_Node>> expected;
+    for (const boost::shared_ptr<CountingNode>& n : counted)
+        expected.push_back(n);
+    const auto less = [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; };
+    std::stable_sort(expected.begin(), expected.end(), less);
+    for (const boost::shared_ptr<CountingNode>& n : counted)
+        n->names = n->mimeTypes = n->monikers = 0;
+
+    list.sortByOrder();
+
+    for (const boost::shared_ptr<CountingNode>& n : counted) {
+        EXPECT_EQ(n->names, 1);
+        EXPECT_EQ(n->mimeTypes, 1);
+        EXPECT_EQ(n->monikers, 1);
+    }
+    ASSERT_EQ(list.size(), 24);
+    for (int i = 0; i < 20; ++i)
+        EXPECT_EQ(list.at(i).get(), expected[i].get()) << i;
+    for (int i = 20; i < 24; ++i)
+        EXPECT_FALSE(list.at(i)) << i;
+
+    // Nothing to do for no node or one.
+    Zel_NodeList one;
+    one.append(counted.front());
+    one.sortByOrder();
+    Zel_NodeList none;
+    none.sortByOrder();
+    EXPECT_EQ(one.size(), 1);
+    EXPECT_TRUE(none.isEmpty());
 }
