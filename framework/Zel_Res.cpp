@@ -44,29 +44,49 @@ bool Zel_Res::deliverNext()
 
 bool Zel_Res::deliverNextStep(AnswerCursor cursor)
 {
-    bool have = false;
-    bool failed = false;
-    if (ZelResults::discardExceptions([&] {
-            have = haveResults();
-            if (have)
-                failed = isCurrentResultError();
-        }))
+    // The common path has one try block; what follows an exception lives in
+    // deliverAfterException().
+    DeliveryStage stage = AskingForAnswer;
+    try {
+        if (haveResults()) {
+            const bool failed = isCurrentResultError();
+            stage = InHandler;
+            if (failed)
+                doFailed();
+            else
+                doSucceeded();
+            stage = AskingForMore;
+            if (haveResults())
+                return true;
+        }
+    } catch (...) {
+        return deliverAfterException(stage, cursor);
+    }
+    return finishDelivery();
+}
+
+bool Zel_Res::deliverAfterException(DeliveryStage stage, AnswerCursor cursor)
+{
+    // Only ever called from a catch handler: rethrows what it caught when
+    // that is the unwinding that cancels a thread.
+    ZelResults::discardExceptions([] { throw; });
+    switch (stage) {
+    case AskingForAnswer:
         return endAfterThrowingQuestion(*this, cursor, true);
-    if (!have)
-        return finishIfFinal(*this);
+    case InHandler: {
+        // A handler's exception must not stop delivery of the other answers.
+        bool more = false;
+        if (ZelResults::discardExceptions([&] { more = haveResults(); }))
+            return endAfterThrowingQuestion(*this, cursor, false);
+        return more || finishIfFinal(*this);
+    }
+    case AskingForMore:
+        break;
+    }
+    return endAfterThrowingQuestion(*this, cursor, false);
+}
 
-    // A handler's exception must not stop delivery of the other answers.
-    ZelResults::discardExceptions([this, failed] {
-        if (failed)
-            doFailed();
-        else
-            doSucceeded();
-    });
-
-    bool more = false;
-    if (ZelResults::discardExceptions([&] { more = haveResults(); }))
-        return endAfterThrowingQuestion(*this, cursor, false);
-    if (more)
-        return true;
+bool Zel_Res::finishDelivery()
+{
     return finishIfFinal(*this);
 }

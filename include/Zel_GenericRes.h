@@ -36,6 +36,13 @@
 // cannot be read, or a derived class's override), the call ends and the cursor
 // passes over the current item. No lock is taken: a result is filled by one
 // thread, then delivered.
+//
+// Speed: deliverNext() is defined here, so the compiler sees the five
+// operations of the class and may call them directly once it has checked that
+// the object's virtual slots hold them (a derived class that replaces one is
+// still called through its slot). The common path has a single try block; what
+// follows an exception is Zel_Res's. While one item is handed over, the next
+// item's error record and node are fetched into the cache.
 #ifndef ZEL_GENERICRES_H
 #define ZEL_GENERICRES_H
 
@@ -60,8 +67,38 @@ public:
     Zel_GenericRes& operator=(const Zel_GenericRes& other) = default;
 
     // The delivery of Zel_Res; when a question about the current item throws,
-    // the next call goes on with the item after it.
-    bool deliverNext() override { return deliverNextStep(&Zel_GenericRes::stepCursor); }
+    // the next call goes on with the item after it. The same steps as
+    // Zel_Res::deliverNextStep, here where the compiler sees this class's own
+    // operations: it may call them directly (after checking that the object's
+    // virtual slots still hold them) instead of through the slots.
+    bool deliverNext() override
+    {
+        DeliveryStage stage = AskingForAnswer;
+        try {
+            if (this->haveResults()) {
+                const bool failed = this->isCurrentResultError();
+                stage = InHandler;
+                if (failed)
+                    this->doFailed();
+                else
+                    this->doSucceeded();
+                stage = AskingForMore;
+                if (this->haveResults())
+                    return true;
+            }
+        } catch (...) {
+            return deliverAfterException(stage, &Zel_GenericRes::stepCursor);
+        }
+        return finishDelivery();
+    }
+
+    // Makes room for count more answers ahead of filling a long result, so
+    // that adding them does not move the ones stored; delivery is unchanged.
+    void reserveResults(std::size_t count)
+    {
+        auto& items = derived().mItems;
+        items.reserve(items.size() + count);
+    }
 
     // True while the cursor is below the number of items.
     bool haveResults() override
@@ -86,7 +123,7 @@ public:
         Derived& self = derived();
         if (self.mCursor >= self.mItems.size())
             return;
-        const auto& item = self.mItems[static_cast<std::size_t>(self.mCursor++)];
+        const auto& item = takeCurrent(self);
         if (self.mCallback)
             Derived::callFailed(*self.mCallback, item);
     }
@@ -97,7 +134,7 @@ public:
         Derived& self = derived();
         if (self.mCursor >= self.mItems.size())
             return;
-        const auto& item = self.mItems[static_cast<std::size_t>(self.mCursor++)];
+        const auto& item = takeCurrent(self);
         if (self.mCallback)
             Derived::callSucceeded(*self.mCallback, item);
     }
@@ -122,6 +159,40 @@ protected:
 
 private:
     Derived& derived() { return static_cast<Derived&>(*this); }
+
+    // The item at the cursor (which the caller has checked), the cursor moved
+    // past it. Asks for the next item's error record and node (where items
+    // carry one, as mNode) to be brought into the cache meanwhile: over long
+    // results the handler's copy of each payload would otherwise wait for
+    // memory, after the work of the delivery call rather than during it.
+    static const auto& takeCurrent(Derived& self)
+    {
+        const std::size_t current = static_cast<std::size_t>(self.mCursor++);
+        if (current + 1 < self.mItems.size()) {
+            const auto& next = self.mItems[current + 1];
+            prefetch(next.mError.get());
+            prefetchNode(next, 0);
+        }
+        return self.mItems[current];
+    }
+
+    static void prefetch(const void* address)
+    {
+#if defined(__GNUC__)
+        __builtin_prefetch(address);
+#else
+        (void)address;
+#endif
+    }
+    template <class Item>
+    static auto prefetchNode(const Item& item, int) -> decltype(item.mNode.get(), void())
+    {
+        prefetch(item.mNode.get());
+    }
+    template <class Item>
+    static void prefetchNode(const Item&, long)
+    {
+    }
 
     static bool stepCursor(Zel_Res& result, bool skip)
     {

@@ -60,6 +60,21 @@ protected:
     // throws, the cursor (if given) passes over the current answer; without
     // one the result ends.
     bool deliverNextStep(AnswerCursor cursor);
+
+    // Where in a deliverNext() step an exception was thrown.
+    enum DeliveryStage {
+        AskingForAnswer, // haveResults() or isCurrentResultError() before the handler
+        InHandler,       // doFailed() or doSucceeded()
+        AskingForMore    // haveResults() after the handler
+    };
+    // The rest of a deliverNext() step whose operation threw at stage; called
+    // from the handler that caught the exception. The exception that cancels
+    // a thread is thrown on; every other is discarded and the step goes on as
+    // deliverNextStep() describes.
+    bool deliverAfterException(DeliveryStage stage, AnswerCursor cursor);
+    // The end of a step that found no answer left: a final result's
+    // doFinished(), its exceptions discarded; false.
+    bool finishDelivery();
 };
 
 #endif

@@ -405,6 +405,67 @@ TEST(Zel_ResTest, ThrowingQuestionsEndTheCallAndTheNextCallMovesOnToTheNextItem)
     }
 }
 
+namespace {
+
+// A node result that replaces all five delivery operations: each records its
+// call; the verdict is the base's, or "error" for every item with allErrors.
+struct ReplacingRes : Zel_GetNodeRes {
+    ReplacingRes(CallLog& log, bool allErrors)
+        : Zel_GetNodeRes(boost::make_shared<NodeCB<Zel_ResultCB>>(log), true), mLog(log), mAllErrors(allErrors)
+    {
+    }
+    bool haveResults() override
+    {
+        mLog.record("haveResults");
+        return Zel_GetNodeRes::haveResults();
+    }
+    bool isCurrentResultError() override
+    {
+        mLog.record("isCurrentResultError");
+        return mAllErrors || Zel_GetNodeRes::isCurrentResultError();
+    }
+    void doFailed() override
+    {
+        mLog.record("doFailed");
+        Zel_GetNodeRes::doFailed();
+    }
+    void doSucceeded() override
+    {
+        mLog.record("doSucceeded");
+        Zel_GetNodeRes::doSucceeded();
+    }
+    void doFinished() override { mLog.record("doFinished"); }
+    CallLog& mLog;
+    bool mAllErrors;
+};
+
+} // namespace
+
+TEST(Zel_ResTest, DerivedResultReplacesEveryDeliveryOperationThroughItsSlot)
+{
+    // Delivery may call a generic result's own operations directly, but only
+    // while the object's slots hold them: a class derived from it that
+    // replaces them is asked every question and does every step itself.
+    CallLog log;
+    ReplacingRes result(log, false);
+    result.setResult(log.node("n1"), ok());
+    result.setResult(log.node("n2"), log.error("e2"));
+    Orv_Result& engineView = result; // the call the engine makes
+    EXPECT_TRUE(engineView.deliverNext());
+    EXPECT_FALSE(engineView.deliverNext());
+    EXPECT_EQ(log.calls, (Calls{"haveResults", "isCurrentResultError", "doSucceeded", "succeeded(n1)", "haveResults",
+                                "haveResults", "isCurrentResultError", "doFailed", "failed(e2)", "haveResults",
+                                "doFinished"}));
+
+    CallLog errorsLog;
+    ReplacingRes errors(errorsLog, true);
+    errors.setResult(errorsLog.node("n1"), errorsLog.error("ok1", -1));
+    Orv_Result& errorsView = errors;
+    EXPECT_FALSE(errorsView.deliverNext());
+    EXPECT_EQ(errorsLog.calls,
+              (Calls{"haveResults", "isCurrentResultError", "doFailed", "failed(ok1)", "haveResults", "doFinished"}));
+}
+
 TEST(Zel_ResTest, ThreadExitInsideAHandlerEndsOnlyThatThreadAndDeliveryGoesOn)
 {
     // pthread_exit unwinds with an exception that must not be swallowed; a
