@@ -5,6 +5,8 @@
 
 #include "Zel_MimeTypeSpec.h"
 
+#include <utility>
+
 Zel_MemoryNode::Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree)
     : Zel_Node(snapshot.nodeID)
     , mSnapshot(snapshot)
@@ -15,6 +17,19 @@ Zel_MemoryNode::Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr
     setMasterMoniker(snapshot.masterMoniker);
     setParentNodeID(snapshot.parentNodeID);
     setChildrenCount(snapshot.childrenCount);
+    setValid(true);
+}
+
+Zel_MemoryNode::Zel_MemoryNode(Snapshot&& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree)
+    : Zel_Node(snapshot.nodeID)
+    , mSnapshot(std::move(snapshot))
+    , mTree(tree)
+    , mProperties(mSnapshot.properties)
+{
+    setMoniker(mSnapshot.moniker);
+    setMasterMoniker(mSnapshot.masterMoniker);
+    setParentNodeID(mSnapshot.parentNodeID);
+    setChildrenCount(mSnapshot.childrenCount);
     setValid(true);
 }
 

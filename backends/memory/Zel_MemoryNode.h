@@ -54,6 +54,8 @@ public:
     };
 
     Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree);
+    // The same, taking the snapshot over.
+    Zel_MemoryNode(Snapshot&& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree);
     virtual ~Zel_MemoryNode();
 
     virtual bool isReserved() const override;

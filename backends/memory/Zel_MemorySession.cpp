@@ -247,7 +247,7 @@ bool Zel_MemorySession::isValidMoniker(const QString& moniker) const
         return true;
     ZelMemory::Tree& data = mState->tree->data();
     ZelMemory::ReadHold hold(data);
-    return data.idByMoniker.contains(moniker);
+    return data.byMoniker(moniker) != nullptr;
 }
 
 boost::shared_ptr<Orv_ResultQ> Zel_MemorySession::getResultQSP() const

@@ -1,5 +1,6 @@
 #include "Zel_MemoryTree.h"
 
+#include "memory_session_p.h"
 #include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 
@@ -113,6 +114,24 @@ QStringList Zel_MemoryTree::userNames() const
     for (const ZelMemory::User& user : d->users)
         names << user.name;
     return names;
+}
+
+QList<boost::shared_ptr<Zel_Node>> Zel_MemoryTree::childSnapshots(const boost::shared_ptr<Zel_MemoryTree>& tree,
+                                                                  const QString& parentMoniker, const QString& user)
+{
+    QList<boost::shared_ptr<Zel_Node>> nodes;
+    const ZelMemory::Tree& data = *tree->d;
+    ZelMemory::ReadHold hold(data);
+    const ZelMemory::Node* parent = data.byMoniker(parentMoniker);
+    if (!parent)
+        return nodes;
+    const ZelMemory::SnapshotContext context = ZelMemory::childContext(data, parent, user);
+    nodes.reserve(parent->children.size());
+    for (const QString& id : parent->children) {
+        if (const ZelMemory::Node* child = data.byId(id))
+            nodes.append(ZelMemory::snapshotOf(data, *child, user, context, tree));
+    }
+    return nodes;
 }
 
 ZelMemory::Tree& Zel_MemoryTree::data() const

@@ -21,11 +21,14 @@
 #include "zel_memory_export.h"
 
 #include <QByteArray>
+#include <QList>
 #include <QString>
 #include <QStringList>
 #include <boost/shared_ptr.hpp>
 
 #include <memory>
+
+class Zel_Node;
 
 namespace ZelMemory {
 class Tree;
@@ -67,6 +70,14 @@ public:
     int nodeCount() const;
     // The names of the users who may log in.
     QStringList userNames() const;
+
+    // Snapshots of the children of the node at parentMoniker as the requests
+    // of user see them (the Zel_MemoryNode objects every request answers
+    // with), in the order the children were added, without checking rights
+    // or putting them in node order; empty when no node has the moniker. For
+    // tools and benchmarks that read a tree without a session.
+    static QList<boost::shared_ptr<Zel_Node>> childSnapshots(const boost::shared_ptr<Zel_MemoryTree>& tree,
+                                                             const QString& parentMoniker, const QString& user);
 
     // The backend's own access to the records (not for applications).
     ZelMemory::Tree& data() const;

@@ -25,6 +25,8 @@
 #include <QJsonValue>
 #include <QSet>
 
+#include <cstring>
+#include <memory>
 #include <vector>
 
 namespace ZelMemory {
@@ -35,6 +37,50 @@ const char* const kFormat = "zel-memory-tree";
 
 struct Failure {
     QString message;
+};
+
+// Where a value sits in the file (root.children[2].name), for messages. The
+// path of a node is kept as a step (its parent's step and its index among the
+// children) and written out only when a message needs it, so that loading a
+// large tree spends nothing on the paths of values that are fine.
+struct PathStep {
+    int parent; // the parent's step; -1 for the root
+    int index;  // among the parent's children
+};
+
+class Where
+{
+public:
+    // A path given as text.
+    Where(const QString& text)
+        : mText(&text)
+    {
+    }
+    // The path of the node at step.
+    Where(const std::vector<PathStep>& steps, int step)
+        : mSteps(&steps)
+        , mStep(step)
+    {
+    }
+
+    QString text() const
+    {
+        if (mText)
+            return *mText;
+        std::vector<int> indexes;
+        for (int step = mStep; (*mSteps)[static_cast<std::size_t>(step)].parent >= 0;
+             step = (*mSteps)[static_cast<std::size_t>(step)].parent)
+            indexes.push_back((*mSteps)[static_cast<std::size_t>(step)].index);
+        QString path = QStringLiteral("root");
+        for (auto it = indexes.rbegin(); it != indexes.rend(); ++it)
+            path += QStringLiteral(".children[") + QString::number(*it) + QLatin1Char(']');
+        return path;
+    }
+
+private:
+    const QString* mText = nullptr;
+    const std::vector<PathStep>* mSteps = nullptr;
+    int mStep = 0;
 };
 
 class Reader
@@ -75,7 +121,7 @@ private:
         throw Failure{mSource + QStringLiteral(": ") + path + QStringLiteral(": ") + message};
     }
 
-    QString optString(const QJsonObject& object, const QString& key, const QString& parent, const QString& fallback)
+    QString optString(const QJsonObject& object, const QString& key, const Where& parent, const QString& fallback)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
@@ -85,19 +131,20 @@ private:
         return value.toString();
     }
 
-    QString reqString(const QJsonObject& object, const QString& key, const QString& parent)
+    QString reqString(const QJsonObject& object, const QString& key, const Where& parent)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined())
             fail(fieldPath(parent, key), QStringLiteral("missing"));
         if (!value.isString())
             fail(fieldPath(parent, key), QStringLiteral("expected a string"));
-        if (value.toString().isEmpty())
+        QString text = value.toString();
+        if (text.isEmpty())
             fail(fieldPath(parent, key), QStringLiteral("must not be empty"));
-        return value.toString();
+        return text;
     }
 
-    bool optBool(const QJsonObject& object, const QString& key, const QString& parent, bool fallback)
+    bool optBool(const QJsonObject& object, const QString& key, const Where& parent, bool fallback)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
@@ -107,7 +154,7 @@ private:
         return value.toBool();
     }
 
-    int optInt(const QJsonObject& object, const QString& key, const QString& parent, int fallback)
+    int optInt(const QJsonObject& object, const QString& key, const Where& parent, int fallback)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
@@ -117,7 +164,7 @@ private:
         return value.toInt();
     }
 
-    QDateTime optDate(const QJsonObject& object, const QString& key, const QString& parent)
+    QDateTime optDate(const QJsonObject& object, const QString& key, const Where& parent)
     {
         const QString text = optString(object, key, parent, QString());
         if (text.isEmpty())
@@ -128,7 +175,7 @@ private:
         return date.toUTC();
     }
 
-    QJsonArray optArray(const QJsonObject& object, const QString& key, const QString& parent)
+    QJsonArray optArray(const QJsonObject& object, const QString& key, const Where& parent)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
@@ -138,7 +185,7 @@ private:
         return value.toArray();
     }
 
-    QJsonObject optObject(const QJsonObject& object, const QString& key, const QString& parent)
+    QJsonObject optObject(const QJsonObject& object, const QString& key, const Where& parent)
     {
         const QJsonValue value = object.value(key);
         if (value.isUndefined() || value.isNull())
@@ -158,7 +205,11 @@ private:
     static QString at(const QString& path, int i) { return path + QLatin1Char('[') + QString::number(i) + QLatin1Char(']'); }
     static QString dot(const QString& path, const QString& key) { return path + QLatin1Char('.') + key; }
     // The path of a member: its key alone at the top, otherwise parent.key.
-    static QString fieldPath(const QString& parent, const QString& key) { return parent.isEmpty() ? key : dot(parent, key); }
+    static QString fieldPath(const Where& parent, const QString& key)
+    {
+        const QString text = parent.text();
+        return text.isEmpty() ? key : dot(text, key);
+    }
 
     // Settings obey the limits of settings documents (see MaxSettingsLevels).
     SettingPairs readPairs(const QJsonObject& object, const QString& path)
@@ -290,12 +341,12 @@ private:
         }
     }
 
-    QList<Marker> readMarkers(const QJsonObject& o, const QString& key, const QString& path)
+    QList<Marker> readMarkers(const QJsonObject& o, const QString& key, const Where& path)
     {
         QList<Marker> markers;
         const QJsonArray list = optArray(o, key, path);
         for (int i = 0; i < list.size(); ++i) {
-            const QString p = at(dot(path, key), i);
+            const QString p = at(dot(path.text(), key), i);
             const QJsonObject m = element(list, i, p);
             Marker marker;
             marker.id = reqString(m, QStringLiteral("id"), p);
@@ -311,11 +362,11 @@ private:
     // Also makes room for all the nodes in the tree's tables.
     void collectExplicitIds(const QJsonObject& root)
     {
-        std::vector<QJsonObject> pending{root};
+        // The arrays of children still to visit; each node is looked at in
+        // place, without being copied out of its array.
+        std::vector<QJsonArray> pending;
         int count = 0;
-        while (!pending.empty()) {
-            const QJsonObject o = pending.back();
-            pending.pop_back();
+        auto visit = [&](const QJsonObject& o) {
             ++count;
             const QJsonValue id = o.value(QStringLiteral("id"));
             if (id.isString())
@@ -324,23 +375,43 @@ private:
             if (moniker.isString())
                 mExplicitMonikers.insert(moniker.toString());
             const QJsonValue children = o.value(QStringLiteral("children"));
-            if (children.isArray()) {
-                for (const QJsonValue& child : children.toArray()) {
-                    if (child.isObject())
-                        pending.push_back(child.toObject());
-                }
+            if (children.isArray())
+                pending.push_back(children.toArray());
+        };
+        visit(root);
+        while (!pending.empty()) {
+            const QJsonArray children = pending.back();
+            pending.pop_back();
+            for (const QJsonValue& child : children) {
+                if (child.isObject())
+                    visit(child.toObject());
             }
         }
         mTree.nodes.reserve(static_cast<std::size_t>(count));
-        mTree.idByMoniker.reserve(count);
-        mPaths.reserve(count);
+        mSteps.reserve(static_cast<std::size_t>(count));
     }
 
+    // One copy of each text that many nodes repeat (mime types, property
+    // keys): the nodes share it rather than holding a copy each.
+    QString shared(const QString& text)
+    {
+        auto known = mSharedTexts.constFind(text);
+        if (known != mSharedTexts.constEnd())
+            return *known;
+        mSharedTexts.insert(text);
+        return text;
+    }
+
+    // A node ID that no node has and that the file gives to no node later,
+    // whose moniker no node has either, now or later in the file. The tree
+    // holds only this file's nodes, whose IDs and monikers are either given
+    // in the file (collectExplicitIds) or made here from serial numbers that
+    // never repeat: checking the file's is enough.
     QString generatedId()
     {
         for (;;) {
-            const QString id = mTree.newNodeId();
-            if (!mExplicitIds.contains(id) && !mExplicitMonikers.contains(monikerOfId(id)))
+            const QString id = mTree.nextNodeId();
+            if (!mExplicitIds.contains(id) && (mExplicitMonikers.isEmpty() || !mExplicitMonikers.contains(monikerOfId(id))))
                 return id;
         }
     }
@@ -350,78 +421,84 @@ private:
     // folder's children are taken in file order.
     void readNodes(const QJsonObject& rootObject)
     {
-        const QString rootPath = QStringLiteral("root");
-        Node& root = readNode(rootObject, rootPath, nullptr);
+        mSteps.push_back(PathStep{-1, 0});
+        Node& root = readNode(rootObject, 0, nullptr);
         if (!Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(root.mimeType))
             fail(QStringLiteral("root.mimeType"), QStringLiteral("the root must be a container (project, bin, folder, catalog, workspace), not \"%1\"").arg(root.mimeType));
         mTree.rootId = root.id;
 
         struct Pending {
             QJsonValue value;
-            QString path;
-            QString parentId;
+            int step;
+            Node* parent; // references into the node table stay valid
             int depth;
         };
         std::vector<Pending> pending;
-        auto pushChildren = [&](const QJsonObject& o, const QString& path, const QString& id, int depth) {
-            const QJsonArray children = optArray(o, QStringLiteral("children"), path);
+        auto pushChildren = [&](const QJsonObject& o, int step, Node& node, int depth) {
+            const QJsonArray children = optArray(o, QStringLiteral("children"), Where(mSteps, step));
             if (children.isEmpty())
                 return;
-            mTree.byId(id)->childByName.reserve(children.size());
-            const QString childrenPath = dot(path, QStringLiteral("children"));
-            for (int i = children.size() - 1; i >= 0; --i)
-                pending.push_back(Pending{children.at(i), at(childrenPath, i), id, depth + 1});
+            node.childByName.reserve(children.size());
+            for (int i = children.size() - 1; i >= 0; --i) {
+                mSteps.push_back(PathStep{step, i});
+                pending.push_back(Pending{children.at(i), static_cast<int>(mSteps.size()) - 1, &node, depth + 1});
+            }
         };
-        pushChildren(rootObject, rootPath, root.id, 0);
+        pushChildren(rootObject, 0, root, 0);
         while (!pending.empty()) {
-            const Pending next = pending.back();
+            const Pending next = std::move(pending.back());
             pending.pop_back();
+            const Where where(mSteps, next.step);
             if (!next.value.isObject())
-                fail(next.path, QStringLiteral("expected an object"));
+                fail(where.text(), QStringLiteral("expected an object"));
             const QJsonObject child = next.value.toObject();
-            Node* parent = mTree.byId(next.parentId);
-            const QString childName = child.value(QStringLiteral("name")).toString();
-            if (!childName.isEmpty() && mTree.childNamed(*parent, childName))
-                fail(dot(next.path, QStringLiteral("name")), QStringLiteral("a second child named \"%1\" in \"%2\"").arg(childName, parent->name));
+            Node* parent = next.parent;
             if (next.depth > MaxDepth)
-                fail(next.path, QStringLiteral("lies %1 levels below the root; the server allows at most %2").arg(next.depth).arg(MaxDepth));
-            const Node& stored = readNode(child, next.path, parent);
-            pushChildren(child, next.path, stored.id, next.depth);
+                fail(where.text(), QStringLiteral("lies %1 levels below the root; the server allows at most %2").arg(next.depth).arg(MaxDepth));
+            Node& stored = readNode(child, next.step, parent);
+            pushChildren(child, next.step, stored, next.depth);
         }
     }
 
     // One node without its children, inserted under parent (the root when
     // parent is null).
-    Node& readNode(const QJsonObject& o, const QString& path, Node* parent)
+    Node& readNode(const QJsonObject& o, int step, Node* parent)
     {
+        const Where path(mSteps, step);
         Node node;
         node.id = optString(o, QStringLiteral("id"), path, QString());
-        if (node.id.isEmpty())
+        // A generated ID, and the moniker made from it, are known to be new
+        // (generatedId); only given ones are looked up.
+        const bool generated = node.id.isEmpty();
+        if (generated)
             node.id = generatedId();
-        if (mTree.byId(node.id))
-            fail(dot(path, QStringLiteral("id")), QStringLiteral("a second node with the ID \"%1\"").arg(node.id));
-        node.moniker = optString(o, QStringLiteral("moniker"), path, monikerOfId(node.id));
+        else if (mTree.byId(node.id))
+            fail(dot(path.text(), QStringLiteral("id")), QStringLiteral("a second node with the ID \"%1\"").arg(node.id));
+        const QJsonValue givenMoniker = o.value(QStringLiteral("moniker"));
+        const bool defaultMoniker = givenMoniker.isUndefined() || givenMoniker.isNull();
+        node.moniker = defaultMoniker ? monikerOfId(node.id) : optString(o, QStringLiteral("moniker"), path, QString());
         if (node.moniker.isEmpty())
-            fail(dot(path, QStringLiteral("moniker")), QStringLiteral("must not be empty"));
-        if (mTree.idByMoniker.contains(node.moniker))
-            fail(dot(path, QStringLiteral("moniker")), QStringLiteral("a second node with the moniker \"%1\"").arg(node.moniker));
+            fail(dot(path.text(), QStringLiteral("moniker")), QStringLiteral("must not be empty"));
+        if (!(generated && defaultMoniker) && mTree.byMoniker(node.moniker))
+            fail(dot(path.text(), QStringLiteral("moniker")), QStringLiteral("a second node with the moniker \"%1\"").arg(node.moniker));
         node.name = reqString(o, QStringLiteral("name"), path);
         if (node.name.contains(QLatin1Char('/')))
-            fail(dot(path, QStringLiteral("name")),
+            fail(dot(path.text(), QStringLiteral("name")),
                  QStringLiteral("\"%1\" contains \"/\", which separates the names of a path").arg(node.name));
         if (node.name.size() > MaxNameLength)
-            fail(dot(path, QStringLiteral("name")),
+            fail(dot(path.text(), QStringLiteral("name")),
                  QStringLiteral("longer than the %1 characters a name may have").arg(MaxNameLength));
         node.mimeType = reqString(o, QStringLiteral("mimeType"), path);
         Zel_MimeTypeValue mimeValue;
         if (!Zel_MimeTypeSpec::getType(node.mimeType, mimeValue))
-            fail(dot(path, QStringLiteral("mimeType")), QStringLiteral("unknown mime type \"%1\"").arg(node.mimeType));
+            fail(dot(path.text(), QStringLiteral("mimeType")), QStringLiteral("unknown mime type \"%1\"").arg(node.mimeType));
+        node.mimeType = shared(node.mimeType);
         if (parent && !Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(parent->mimeType))
-            fail(path, QStringLiteral("the parent \"%1\" is a %2, which cannot hold children").arg(parent->name, parent->mimeType));
+            fail(path.text(), QStringLiteral("the parent \"%1\" is a %2, which cannot hold children").arg(parent->name, parent->mimeType));
         node.mobId = optString(o, QStringLiteral("mobID"), path, QString());
         if (!node.mobId.isEmpty()) {
             if (mMobIds.contains(node.mobId))
-                fail(dot(path, QStringLiteral("mobID")),
+                fail(dot(path.text(), QStringLiteral("mobID")),
                      QStringLiteral("a second node with the media object ID \"%1\"").arg(node.mobId));
             mMobIds.insert(node.mobId);
         }
@@ -430,28 +507,28 @@ private:
         node.created = optDate(o, QStringLiteral("created"), path);
         node.modified = optDate(o, QStringLiteral("modified"), path);
 
-        const QString propsPath = dot(path, QStringLiteral("properties"));
+        auto propsPath = [&path] { return dot(path.text(), QStringLiteral("properties")); };
         const QJsonObject props = optObject(o, QStringLiteral("properties"), path);
         for (auto it = props.begin(); it != props.end(); ++it) {
             Property p;
-            p.key = it.key();
+            p.key = shared(it.key());
             if (p.key == QLatin1String("Name") || p.key == QLatin1String("Mime Type") || p.key == QLatin1String("MobID"))
-                fail(dot(propsPath, p.key), QStringLiteral("set by \"name\", \"mimeType\" and \"mobID\", not as a property"));
+                fail(dot(propsPath(), p.key), QStringLiteral("set by \"name\", \"mimeType\" and \"mobID\", not as a property"));
             if (it.value().isString()) {
                 p.value = it.value().toString();
             } else if (it.value().isObject()) {
                 const QJsonObject po = it.value().toObject();
-                p.value = optString(po, QStringLiteral("value"), dot(propsPath, p.key), QString());
-                p.customValues = optString(po, QStringLiteral("customValues"), dot(propsPath, p.key), QString());
+                p.value = optString(po, QStringLiteral("value"), dot(propsPath(), p.key), QString());
+                p.customValues = optString(po, QStringLiteral("customValues"), dot(propsPath(), p.key), QString());
             } else {
-                fail(dot(propsPath, p.key), QStringLiteral("expected a string or an object with \"value\" and \"customValues\""));
+                fail(dot(propsPath(), p.key), QStringLiteral("expected a string or an object with \"value\" and \"customValues\""));
             }
             node.properties.append(p);
         }
 
-        const QString resPath = dot(path, QStringLiteral("reservation"));
         const QJsonObject reservation = optObject(o, QStringLiteral("reservation"), path);
         if (!reservation.isEmpty()) {
+            const QString resPath = dot(path.text(), QStringLiteral("reservation"));
             node.reservation.user = reqString(reservation, QStringLiteral("user"), resPath);
             if (!mTree.user(node.reservation.user))
                 fail(dot(resPath, QStringLiteral("user")), QStringLiteral("no user is named \"%1\"").arg(node.reservation.user));
@@ -459,10 +536,9 @@ private:
             node.reservation.until = optDate(reservation, QStringLiteral("until"), resPath);
         }
 
-        const QString permPath = dot(path, QStringLiteral("permissions"));
         const QJsonObject permissions = optObject(o, QStringLiteral("permissions"), path);
         for (auto it = permissions.begin(); it != permissions.end(); ++it) {
-            const QString p = dot(permPath, it.key());
+            const QString p = dot(dot(path.text(), QStringLiteral("permissions")), it.key());
             if (it.key() != QLatin1String("*") && !mTree.user(it.key()))
                 fail(p, QStringLiteral("no user is named \"%1\"").arg(it.key()));
             if (!it.value().isArray())
@@ -485,7 +561,7 @@ private:
 
         const QJsonArray deps = optArray(o, QStringLiteral("dependencies"), path);
         for (int i = 0; i < deps.size(); ++i) {
-            const QString p = at(dot(path, QStringLiteral("dependencies")), i);
+            const QString p = at(dot(path.text(), QStringLiteral("dependencies")), i);
             const QJsonObject d = element(deps, i, p);
             Dependency dep;
             dep.moniker = reqString(d, QStringLiteral("moniker"), p);
@@ -497,7 +573,7 @@ private:
 
         const QJsonArray media = optArray(o, QStringLiteral("media"), path);
         for (int i = 0; i < media.size(); ++i) {
-            const QString p = at(dot(path, QStringLiteral("media")), i);
+            const QString p = at(dot(path.text(), QStringLiteral("media")), i);
             const QJsonObject m = element(media, i, p);
             Media file;
             file.path = reqString(m, QStringLiteral("path"), p);
@@ -507,13 +583,19 @@ private:
 
         Node* stored = nullptr;
         if (parent) {
+            // A name the parent's index of names already holds is a second
+            // child of that name; the index is looked up once, by the
+            // insertion (the tree is dropped when the load fails).
+            const int named = parent->childByName.size();
             stored = &mTree.insertNode(std::move(node), *parent);
+            if (parent->childByName.size() == named)
+                fail(dot(path.text(), QStringLiteral("name")),
+                     QStringLiteral("a second child named \"%1\" in \"%2\"").arg(stored->name, parent->name));
         } else {
-            const QString id = node.id;
-            mTree.idByMoniker.insert(node.moniker, id);
-            stored = &mTree.nodes.emplace(id, std::move(node)).first->second;
+            stored = &mTree.addNode(std::move(node));
         }
-        mPaths.insert(stored->id, path);
+        if (!stored->masterMoniker.isEmpty())
+            mMasters.emplace_back(stored, step);
         return *stored;
     }
 
@@ -524,16 +606,17 @@ private:
             if (!mTree.byMoniker(dependency.first))
                 fail(dependency.second, QStringLiteral("no node has the moniker \"%1\"").arg(dependency.first));
         }
-        for (const auto& entry : mTree.nodes) {
-            const Node& node = entry.second;
-            if (!node.masterMoniker.isEmpty() && !mTree.byMoniker(node.masterMoniker) && !mTree.byId(node.masterMoniker))
-                fail(dot(mPaths.value(node.id), QStringLiteral("master")),
+        // Masters, in file order (only the nodes that name one are visited).
+        for (const auto& master : mMasters) {
+            const Node& node = *master.first;
+            if (!mTree.byMoniker(node.masterMoniker) && !mTree.byId(node.masterMoniker))
+                fail(dot(Where(mSteps, master.second).text(), QStringLiteral("master")),
                      QStringLiteral("no node has the moniker or ID \"%1\"").arg(node.masterMoniker));
         }
         // A master given by ID is stored as the master's moniker.
-        for (auto& entry : mTree.nodes) {
-            Node& node = entry.second;
-            if (!node.masterMoniker.isEmpty() && !mTree.byMoniker(node.masterMoniker))
+        for (const auto& master : mMasters) {
+            Node& node = *master.first;
+            if (!mTree.byMoniker(node.masterMoniker))
                 node.masterMoniker = mTree.byId(node.masterMoniker)->moniker;
         }
     }
@@ -557,10 +640,12 @@ private:
 
     Tree& mTree;
     QString mSource;
-    QHash<QString, QString> mPaths; // node ID -> path in the file
+    std::vector<PathStep> mSteps;      // every node's place in the file; the root's first
+    std::vector<std::pair<Node*, int>> mMasters; // the nodes that name a master, with their steps, in file order
     QSet<QString> mExplicitIds;
     QSet<QString> mExplicitMonikers;
     QSet<QString> mMobIds;
+    QSet<QString> mSharedTexts;
     QList<QPair<QString, QString>> mDependencyPaths; // moniker -> path of the dependency's moniker
 };
 
@@ -723,27 +808,53 @@ QJsonObject nodeToJson(const Tree& tree, const Node& node)
 // reports that error instead.
 bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, QString& name)
 {
+    // The names of the open objects lie on one stack, each object's above
+    // its start: nothing is allocated per object. A name of plain ASCII
+    // without escapes is compared as it is written; any other is unescaped
+    // (and decoded) once. An object with many names looks them up in a hash.
+    struct Name {
+        int offset;    // of the opening quote
+        int length;    // of the text between the quotes
+        bool plain;    // ASCII without escapes: the text is the name
+        QString text;  // the name, when it is not plain
+    };
     struct Level {
         bool object;
         bool expectName;
-        QHash<QString, int> names; // name -> offset
+        std::size_t firstName;            // index into names
+        std::unique_ptr<QHash<QString, int>> index; // name -> index into names, for large objects
     };
+    const std::size_t HashFrom = 16;
     std::vector<Level> levels;
+    std::vector<Name> names;
     const char* data = json.constData();
     const int size = json.size();
+    auto textOf = [data](const Name& n) {
+        return n.plain ? QString::fromLatin1(data + n.offset + 1, n.length) : n.text;
+    };
+    auto same = [data](const Name& a, const Name& b) {
+        if (a.plain && b.plain)
+            return a.length == b.length && std::memcmp(data + a.offset + 1, data + b.offset + 1, a.length) == 0;
+        if (a.plain)
+            return b.text == QLatin1String(data + a.offset + 1, a.length);
+        if (b.plain)
+            return a.text == QLatin1String(data + b.offset + 1, b.length);
+        return a.text == b.text;
+    };
     for (int i = 0; i < size; ++i) {
         const char c = data[i];
         switch (c) {
         case '{':
-            levels.push_back(Level{true, true, QHash<QString, int>()});
+            levels.push_back(Level{true, true, names.size(), nullptr});
             break;
         case '[':
-            levels.push_back(Level{false, false, QHash<QString, int>()});
+            levels.push_back(Level{false, false, names.size(), nullptr});
             break;
         case '}':
         case ']':
             if (levels.empty() || levels.back().object != (c == '}'))
                 return false;
+            names.resize(levels.back().firstName);
             levels.pop_back();
             break;
         case ',':
@@ -753,43 +864,66 @@ bool findDuplicateMember(const QByteArray& json, int& offset, int& firstOffset, 
         case '"': {
             const int start = i;
             bool escaped = false;
+            bool ascii = true;
             int j = i + 1;
             while (j < size && data[j] != '"') {
                 if (data[j] == '\\') {
                     escaped = true;
                     ++j;
+                } else if (static_cast<unsigned char>(data[j]) >= 0x80) {
+                    ascii = false;
                 }
                 ++j;
             }
             i = j; // the closing quote
             if (levels.empty() || !levels.back().object || !levels.back().expectName)
                 break;
-            levels.back().expectName = false;
+            Level& level = levels.back();
+            level.expectName = false;
             int colon = j + 1;
             while (colon < size && (data[colon] == ' ' || data[colon] == '\t' || data[colon] == '\n' || data[colon] == '\r'))
                 ++colon;
             if (colon >= size || data[colon] != ':')
                 return false;
-            QString text;
-            if (!escaped) {
-                text = QString::fromUtf8(data + start + 1, j - start - 1);
-            } else {
-                // Let the JSON reader unescape the name: ["<name>"].
-                const QByteArray wrapped = QByteArray("[") + QByteArray(data + start, j - start + 1) + ']';
-                QJsonParseError unescapeError;
-                const QJsonDocument unescaped = QJsonDocument::fromJson(wrapped, &unescapeError);
-                if (unescapeError.error != QJsonParseError::NoError)
-                    return false;
-                text = unescaped.array().at(0).toString();
+            Name current{start, j - start - 1, ascii && !escaped, QString()};
+            if (!current.plain) {
+                if (!escaped) {
+                    current.text = QString::fromUtf8(data + start + 1, j - start - 1);
+                } else {
+                    // Let the JSON reader unescape the name: ["<name>"].
+                    const QByteArray wrapped = QByteArray("[") + QByteArray(data + start, j - start + 1) + ']';
+                    QJsonParseError unescapeError;
+                    const QJsonDocument unescaped = QJsonDocument::fromJson(wrapped, &unescapeError);
+                    if (unescapeError.error != QJsonParseError::NoError)
+                        return false;
+                    current.text = unescaped.array().at(0).toString();
+                }
             }
-            auto known = levels.back().names.constFind(text);
-            if (known != levels.back().names.constEnd()) {
+            int known = -1;
+            if (level.index) {
+                known = level.index->value(textOf(current), -1);
+            } else {
+                for (std::size_t k = level.firstName; k < names.size(); ++k) {
+                    if (same(names[k], current)) {
+                        known = static_cast<int>(k);
+                        break;
+                    }
+                }
+            }
+            if (known >= 0) {
                 offset = start;
-                firstOffset = known.value();
-                name = text;
+                firstOffset = names[static_cast<std::size_t>(known)].offset;
+                name = textOf(current);
                 return true;
             }
-            levels.back().names.insert(text, start);
+            names.push_back(current);
+            if (level.index) {
+                level.index->insert(textOf(current), static_cast<int>(names.size() - 1));
+            } else if (names.size() - level.firstName >= HashFrom) {
+                level.index.reset(new QHash<QString, int>);
+                for (std::size_t k = level.firstName; k < names.size(); ++k)
+                    level.index->insert(textOf(names[k]), static_cast<int>(k));
+            }
             break;
         }
         default:

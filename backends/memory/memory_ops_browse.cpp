@@ -26,18 +26,21 @@
 #include "Zel_RefreshNodeCB.h"
 #include "Zel_RootNodeCB.h"
 
+#include "Zel_MimeTypeSpec.h"
 #include "Zel_Node.h"
+#include "Zel_NodeList.h"
 
 #include <QFileInfo>
+#include <boost/make_shared.hpp>
 #include <QSet>
 
-#include <algorithm>
+#include <vector>
 
 namespace ZelMemory {
 
 boost::shared_ptr<Zel_Error> ok()
 {
-    return boost::shared_ptr<Zel_Error>(new Zel_Error());
+    return boost::make_shared<Zel_Error>();
 }
 
 boost::shared_ptr<QString> sharedText(const QString& text)
@@ -45,16 +48,28 @@ boost::shared_ptr<QString> sharedText(const QString& text)
     return boost::shared_ptr<QString>(new QString(text));
 }
 
-QList<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent)
+
+std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent)
 {
-    QList<boost::shared_ptr<Zel_Node>> children;
+    // The snapshots are taken in the order the records are stored, then put
+    // in node order by keys read once per snapshot (Zel_NodeList::sortByOrder).
+    // Where the answer releases its snapshots in order, it gets them in the
+    // order taken.
+    const SnapshotContext context = childContext(work.tree, &parent, work.user);
+    const std::size_t count = static_cast<std::size_t>(parent.children.size());
+    std::vector<boost::shared_ptr<Zel_Node>> children;
+    children.reserve(count);
+    if (work.releasedInOrder)
+        work.releasedInOrder->reserve(work.releasedInOrder->size() + count);
     for (const QString& id : parent.children) {
         const Node* child = work.tree.byId(id);
-        if (child && (work.tree.permissionsOf(work.user, *child) & PermRead))
-            children.append(work.snapshot(*child));
+        if (child && (work.tree.permissionsBelow(work.user, *child, context.permissions) & PermRead)) {
+            children.push_back(work.snapshot(*child, context));
+            if (work.releasedInOrder)
+                work.releasedInOrder->push_back(children.back());
+        }
     }
-    std::stable_sort(children.begin(), children.end(),
-                     [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+    Zel_NodeList::sortByOrder(children);
     return children;
 }
 
@@ -236,8 +251,12 @@ void GetChildrenOp::run(Work& work, const Args& args, Result& result)
     ReadHold hold(work.tree);
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
-    for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
-        result.setResult(child, ok());
+    // One "no error" record serves every answer: it never reaches a handler.
+    const boost::shared_ptr<Zel_Error> success = ok();
+    std::vector<boost::shared_ptr<Zel_Node>> children = readableChildren(work, parent);
+    result.reserveResults(children.size());
+    for (boost::shared_ptr<Zel_Node>& child : children)
+        result.setResult(std::move(child), success);
 }
 ZEL_MEMORY_EXECUTE(GetChildrenOp)
 
@@ -247,8 +266,13 @@ void ChildrenOp::run(Work& work, const Args& args, Result& result)
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
     // Each child with its has-children flag.
-    for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
-        result.setResult(child, false, child->getChildrenCount() > 0, ok());
+    const boost::shared_ptr<Zel_Error> success = ok(); // shared, as in GetChildrenOp
+    std::vector<boost::shared_ptr<Zel_Node>> children = readableChildren(work, parent);
+    result.reserveResults(children.size());
+    for (boost::shared_ptr<Zel_Node>& child : children) {
+        const bool hasChildren = child->getChildrenCount() > 0;
+        result.setResult(std::move(child), false, hasChildren, success);
+    }
 }
 ZEL_MEMORY_EXECUTE(ChildrenOp)
 
@@ -345,8 +369,7 @@ void QueryOp::run(Work& work, const Args& args, Result& result)
         if ((work.tree.permissionsOf(work.user, node) & PermRead) && matchesQuery(work.tree, node, query))
             found.append(work.snapshot(node));
     }
-    std::stable_sort(found.begin(), found.end(),
-                     [](const boost::shared_ptr<Zel_Node>& a, const boost::shared_ptr<Zel_Node>& b) { return *a < *b; });
+    Zel_NodeList::sortByOrder(found);
     for (const boost::shared_ptr<Zel_Node>& node : found)
         result.succeed(node);
 }

@@ -29,6 +29,7 @@
 #include <boost/shared_ptr.hpp>
 
 #include <type_traits>
+#include <vector>
 
 class Orv_Result;
 class Zel_LoginCredentials;
@@ -144,8 +145,9 @@ typedef boost::shared_ptr<QString> MonikerSP;
 // Shared by the operations (memory_ops_browse.cpp).
 boost::shared_ptr<Zel_Error> ok();
 boost::shared_ptr<QString> sharedText(const QString& text);
-// The children of the node the user may read, as snapshots in node order.
-QList<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent);
+// The children of the node the user may read, as snapshots in node order
+// (the order of Zel_Node::operator<).
+std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node& parent);
 // The node's locators (restrictions = false) or restrictions (true).
 QList<Zel_FrameLocator> markersOf(const Node& node, bool restrictions);
 // Fails with TooDeep unless a subtree of the given height (0: one node) fits
@@ -318,6 +320,21 @@ ZEL_MEMORY_OPERATION(GetWorkgroupSettingsOp, Zel_SettingsCB, Zel_SettingsRes, tr
 ZEL_MEMORY_OPERATION(GetSettingsOp, Zel_GetSettingsCB, MemoryRes<Zel_GetSettingsCB>, true, QString name;)
 ZEL_MEMORY_OPERATION(SaveSettingsOp, Zel_SaveSettingsCB, MemoryRes<Zel_SaveSettingsCB>, true, QString name;
                      QString xml;)
+
+// The operations that answer a folder's children release their snapshots in
+// the order they were taken (ReleaseInOrder).
+template <>
+struct ReleasesInOrder<GetChildrenOp> : std::true_type {
+};
+template <>
+struct ReleasesInOrder<ChildrenOp> : std::true_type {
+};
+template <>
+struct ReleasesInOrder<ChildrenAtOp> : std::true_type {
+};
+template <>
+struct ReleasesInOrder<ChildrenAtMonikerOp> : std::true_type {
+};
 
 // Every backend result: an error answer is a failure.
 template <class CB>

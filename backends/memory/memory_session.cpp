@@ -8,6 +8,10 @@
 #include "Zel_MimeTypeSpec.h"
 #include "Zel_NodeListener.h"
 
+#include <boost/make_shared.hpp>
+
+#include <algorithm>
+
 namespace ZelMemory {
 
 namespace {
@@ -222,11 +226,13 @@ void SessionState::setFaultHook(const boost::shared_ptr<const FaultHook>& hook)
 void SessionState::track(const boost::shared_ptr<Cancelable>& request)
 {
     std::lock_guard<std::mutex> lock(mMutex);
-    for (auto it = mRequests.begin(); it != mRequests.end();) {
-        if (it->expired())
-            it = mRequests.erase(it);
-        else
-            ++it;
+    if (mRequests.size() >= mSweepAt) {
+        mRequests.erase(std::remove_if(mRequests.begin(), mRequests.end(),
+                                       [](const boost::weak_ptr<Cancelable>& weak) { return weak.expired(); }),
+                        mRequests.end());
+        // Twice what is left: a sweep costs at most as many steps as there
+        // were requests made since the last one.
+        mSweepAt = std::max(MinSweepSize, 2 * mRequests.size());
     }
     mRequests.push_back(request);
 }
@@ -366,33 +372,60 @@ void Work::requireFreeName(const Node& parent, const QString& name, const Node* 
 
 boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n)
 {
+    return snapshotOf(tree, n, user, session.tree);
+}
+
+boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n, const SnapshotContext& context)
+{
+    return snapshotOf(tree, n, user, context, session.tree);
+}
+
+SnapshotContext childContext(const Tree& tree, const Node* parent, const QString& user)
+{
+    SnapshotContext context;
+    context.parent = parent;
+    if (!parent)
+        return context;
+    context.path = tree.pathOf(*parent);
+    for (const Node* p = parent; p && !context.syncedProject; p = tree.parentOf(*p))
+        context.syncedProject = tree.isSyncedProject(*p);
+    context.permissions = tree.permissionsOf(user, *parent);
+    return context;
+}
+
+boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& n, const QString& user,
+                                       const boost::shared_ptr<Zel_MemoryTree>& owner)
+{
+    return snapshotOf(tree, n, user, childContext(tree, tree.parentOf(n), user), owner);
+}
+
+boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& n, const QString& user,
+                                       const SnapshotContext& context, const boost::shared_ptr<Zel_MemoryTree>& owner)
+{
     Zel_MemoryNode::Snapshot s;
     s.moniker = n.moniker;
     s.masterMoniker = n.masterMoniker;
     s.nodeID = n.id;
-    if (const Node* parent = tree.parentOf(n))
-        s.parentNodeID = parent->id;
+    if (context.parent) {
+        s.parentNodeID = context.parent->id;
+        s.path = context.path; // the root's own path is empty
+        s.path.append(n.name);
+    }
     s.childrenCount = static_cast<unsigned long>(n.children.size());
     s.name = n.name;
     s.mimeType = n.mimeType;
     s.mobID = n.mobId;
-    s.path = tree.pathOf(n);
     if (n.reservation.isActive()) { // an expired reservation holds nothing
         s.reservedBy = n.reservation.user;
         s.reservedSince = n.reservation.since;
         s.reservedUntil = n.reservation.until;
     }
-    for (const Node* p = &n; p; p = tree.parentOf(*p)) {
-        if (p->mimeType == QLatin1String("project") && !tree.propertyValue(*p, QStringLiteral("SyncedProject_GUID")).isEmpty()) {
-            s.syncedProject = true;
-            break;
-        }
-    }
+    s.syncedProject = context.syncedProject || tree.isSyncedProject(n);
     s.userPlaced = n.userPlaced;
     s.dropTarget = Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(n.mimeType)
-        && (tree.permissionsOf(user, n) & (PermAddFiles | PermAddFolders)) != 0;
+        && (tree.permissionsBelow(user, n, context.permissions) & (PermAddFiles | PermAddFolders)) != 0;
     s.properties = nodeProperties(tree, n);
-    return boost::shared_ptr<Zel_Node>(new Zel_MemoryNode(s, session.tree));
+    return boost::make_shared<Zel_MemoryNode>(std::move(s), owner);
 }
 
 } // namespace ZelMemory

@@ -81,13 +81,15 @@ Zel_PropertyList nodeProperties(const Tree& tree, const Node& node)
 {
     Q_UNUSED(tree);
     Zel_PropertyList list;
+    const bool locked = node.reservation.isActive();
+    list.reserve(2 + (node.mobId.isEmpty() ? 0 : 1) + node.properties.size() + (locked ? 2 : 0));
     list.append(Zel_Property(QStringLiteral("Name"), node.name, QString()));
     list.append(Zel_Property(QStringLiteral("Mime Type"), node.mimeType, QString()));
     if (!node.mobId.isEmpty())
         list.append(Zel_Property(QStringLiteral("MobID"), node.mobId, QString()));
     for (const Property& p : node.properties)
         list.append(Zel_Property(p.key, p.value, p.customValues));
-    if (node.reservation.isActive()) {
+    if (locked) {
         list.addIfKeyNotInList(Zel_Property(QStringLiteral("Locked By"), node.reservation.user, QString()));
         if (node.reservation.since.isValid())
             list.addIfKeyNotInList(Zel_Property(QStringLiteral("Locked On"), node.reservation.since.toString(Qt::ISODate), QString()));
@@ -113,14 +115,20 @@ const Node* Tree::byId(const QString& id) const
 
 Node* Tree::byMoniker(const QString& moniker)
 {
-    auto it = idByMoniker.constFind(moniker);
-    return it == idByMoniker.constEnd() ? nullptr : byId(it.value());
+    return const_cast<Node*>(static_cast<const Tree*>(this)->byMoniker(moniker));
 }
 
 const Node* Tree::byMoniker(const QString& moniker) const
 {
-    auto it = idByMoniker.constFind(moniker);
-    return it == idByMoniker.constEnd() ? nullptr : byId(it.value());
+    auto given = idByGivenMoniker.constFind(moniker);
+    if (given != idByGivenMoniker.constEnd())
+        return byId(given.value());
+    // A moniker made from an ID names the node with that ID, unless that
+    // node's moniker is another one.
+    if (!moniker.startsWith(MonikerScheme))
+        return nullptr;
+    const Node* node = byId(moniker.mid(MonikerScheme.size()));
+    return node && node->moniker == moniker ? node : nullptr;
 }
 
 const Node* Tree::parentOf(const Node& node) const
@@ -192,6 +200,28 @@ std::uint32_t Tree::permissionsOf(const QString& userName, const Node& node) con
             return all.value();
     }
     return 0;
+}
+
+std::uint32_t Tree::permissionsBelow(const QString& userName, const Node& node, std::uint32_t parentPermissions) const
+{
+    const User* u = user(userName);
+    if (!u)
+        return 0;
+    if (u->admin)
+        return AllPermissions;
+    auto own = node.permissions.constFind(userName);
+    if (own != node.permissions.constEnd())
+        return own.value();
+    auto all = node.permissions.constFind(QStringLiteral("*"));
+    if (all != node.permissions.constEnd())
+        return all.value();
+    return parentPermissions;
+}
+
+bool Tree::isSyncedProject(const Node& node) const
+{
+    return node.mimeType == QLatin1String("project")
+        && !propertyValue(node, QStringLiteral("SyncedProject_GUID")).isEmpty();
 }
 
 const Node* Tree::reservedByOther(const Node& node, const QString& userName, bool below) const
@@ -287,11 +317,22 @@ QString Tree::propertyValue(const Node& node, const QString& keyName) const
     return QString();
 }
 
+QString Tree::nextNodeId()
+{
+    // "N" and the serial number, at least six digits with leading zeros.
+    char digits[24];
+    int start = sizeof digits;
+    for (std::uint64_t n = ++serial; n > 0 || sizeof digits - start < 6; n /= 10)
+        digits[--start] = static_cast<char>('0' + n % 10);
+    digits[--start] = 'N';
+    return QString::fromLatin1(digits + start, static_cast<int>(sizeof digits) - start);
+}
+
 QString Tree::newNodeId()
 {
     for (;;) {
-        const QString id = QStringLiteral("N%1").arg(++serial, 6, 10, QLatin1Char('0'));
-        if (!byId(id) && !idByMoniker.contains(monikerOfId(id)))
+        const QString id = nextNodeId();
+        if (!byId(id) && !byMoniker(monikerOfId(id)))
             return id;
     }
 }
@@ -307,11 +348,17 @@ QString Tree::newMobId()
 
 Node& Tree::insertNode(Node node, Node& parent)
 {
-    const QString id = node.id;
-    idByMoniker.insert(node.moniker, id);
-    Node& stored = nodes.emplace(id, std::move(node)).first->second;
+    Node& stored = addNode(std::move(node));
     attach(stored, parent);
     return stored;
+}
+
+Node& Tree::addNode(Node node)
+{
+    if (node.moniker != monikerOfId(node.id))
+        idByGivenMoniker.insert(node.moniker, node.id);
+    const QString id = node.id;
+    return nodes.emplace(id, std::move(node)).first->second;
 }
 
 Node& Tree::copySubtree(const Node& source, Node& target, const QString& name)
@@ -375,7 +422,7 @@ void Tree::removeSubtree(const QString& id, QStringList* removed)
         auto it = nodes.find(subtree.at(i));
         if (it == nodes.end())
             continue;
-        idByMoniker.remove(it->second.moniker);
+        idByGivenMoniker.remove(it->second.moniker);
         if (removed)
             removed->append(it->first);
         nodes.erase(it);

@@ -204,8 +204,29 @@ typedef QList<QPair<QString, QString>> SettingPairs;
 // "site"), by Zel_GetUserSettingsCB::UserSettingsType value 0, 1, 2.
 const char* userSettingsTypeName(int type);
 
-struct QStringHash {
-    std::size_t operator()(const QString& s) const { return qHash(s); }
+// The hash of the node table. The IDs the server makes ("N" and a serial
+// number, Tree::nextNodeId) hash to their number, so that nodes made one
+// after another fall into neighbouring buckets: loading or building a large
+// tree then walks the bucket table in order instead of at random. Any other
+// text hashes as Qt hashes it.
+struct NodeIdHash {
+    std::size_t operator()(const QString& id) const
+    {
+        const int size = id.size();
+        if (size >= 2 && size <= 20 && id.at(0) == QLatin1Char('N')) {
+            std::size_t number = 0;
+            int i = 1;
+            for (; i < size; ++i) {
+                const ushort unit = id.at(i).unicode();
+                if (unit < '0' || unit > '9')
+                    break;
+                number = number * 10 + (unit - '0');
+            }
+            if (i == size)
+                return number;
+        }
+        return qHash(id);
+    }
 };
 
 // One change for the observers: a child of parentMoniker was added, removed
@@ -233,8 +254,12 @@ public:
     // --- The data; guarded by mutex. ---
     mutable std::shared_mutex mutex;
     QString serverName;
-    std::unordered_map<QString, Node, QStringHash> nodes; // references stay valid on insertion
-    QHash<QString, QString> idByMoniker;
+    std::unordered_map<QString, Node, NodeIdHash> nodes; // references stay valid on insertion
+    // The nodes whose moniker is not the one made from their ID
+    // (monikerOfId): moniker -> ID. Every other node is found by its
+    // moniker through its ID (byMoniker), so a large tree of the server's own
+    // monikers keeps no second table of them.
+    QHash<QString, QString> idByGivenMoniker;
     QString rootId;
     QList<User> users;
     QList<KeyDesc> keys;
@@ -264,6 +289,12 @@ public:
     // node (this one, then upwards) with an entry for the user, or for "*",
     // decides (the user's own entry wins over "*" on the same node).
     std::uint32_t permissionsOf(const QString& user, const Node& node) const;
+    // The same answer for a node whose parent's answer is known
+    // (parentPermissions = permissionsOf(user, parent); 0 for the root),
+    // without walking up: the node's own entry, or else its parent's answer.
+    std::uint32_t permissionsBelow(const QString& user, const Node& node, std::uint32_t parentPermissions) const;
+    // True when the node is a project that carries a synced project GUID.
+    bool isSyncedProject(const Node& node) const;
     // The first node at (and, with below, under) node whose active
     // reservation is held by someone other than user.
     const Node* reservedByOther(const Node& node, const QString& user, bool below = true) const;
@@ -283,9 +314,14 @@ public:
 
     // --- Changes (exclusive lock held). ---
     QString newNodeId();
+    // The next serial node ID, whether a node has it or not (newNodeId skips
+    // those in use).
+    QString nextNodeId();
     QString newMobId();
     // Inserts a fresh node under parent at the end of its children.
     Node& insertNode(Node node, Node& parent);
+    // Adds a fresh node to the tables without a parent (the root).
+    Node& addNode(Node node);
     // Deep copy of source (and its subtree) under target, named name.
     Node& copySubtree(const Node& source, Node& target, const QString& name);
     // Removes node and its subtree; the node IDs removed are appended to removed.

@@ -12,9 +12,13 @@
 
 #include <QDateTime>
 
+#include <QSet>
+
+#include <algorithm>
 #include <functional>
 #include <memory>
 #include <new>
+#include <random>
 #include <stdexcept>
 #include <utility>
 #include <vector>
@@ -623,6 +627,120 @@ TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
     EXPECT_FALSE(session->isLoggedIn());
     EXPECT_FALSE(session->makeGetNodeReqSP(mk(m(Mayor)), rec<NodeRec>()));
     EXPECT_FALSE(session->submitRequest(boost::shared_ptr<Orv_Request>()));
+}
+
+TEST(Zel_MemorySessionOrderTest, ChildrenComeInTheOrderAStableSortByNodeOrderGives)
+{
+    // Random folders: mixed mime types, names that differ only in case, long
+    // names that share their first units, Latin-1 and other letters (some
+    // whose lower case is longer), and children the user may not read. The
+    // children requests answer exactly the readable children in the order
+    // std::stable_sort with Zel_Node::operator< gives them.
+    const QStringList pieces{QStringLiteral("a"), QStringLiteral("A"), QStringLiteral("b"), QStringLiteral("Z"),
+                             QStringLiteral("1"), QStringLiteral(" "), QStringLiteral("\u00e9"), QStringLiteral("\u00c9"),
+                             QStringLiteral("\u00df"), QStringLiteral("\u00ff"), QStringLiteral("\u03a3"),
+                             QStringLiteral("\u03c3"), QStringLiteral("\u0130"), QStringLiteral("i"),
+                             QStringLiteral("Long shared beginning ")};
+    const QStringList mimeTypes{QStringLiteral("bin"), QStringLiteral("masterclip"), QStringLiteral("clip"),
+                                QStringLiteral("sequence"), QStringLiteral("subclip"), QStringLiteral("effect"),
+                                QStringLiteral("folder")};
+    for (unsigned seed = 1; seed <= 6; ++seed) {
+        SCOPED_TRACE(testing::Message() << "seed " << seed);
+        std::mt19937 random(seed);
+        auto pick = [&random](int count) { return static_cast<int>(random() % static_cast<unsigned>(count)); };
+        QSet<QString> used;
+        QSet<QString> unreadable;
+        QString children;
+        // Names alike in their first dozen units and different after them.
+        const QStringList alike{QStringLiteral("Long shared beginning Zed"), QStringLiteral("Long shared beginning apple"),
+                                QStringLiteral("long shared beginning Apple"), QStringLiteral("Long shared beginning \u00c9t\u00e9"),
+                                QStringLiteral("Long shared beginning \u03a3igma"), QStringLiteral("Long shared beginning \u03c3igma"),
+                                QStringLiteral("Long shared begin")};
+        const int count = 40 + pick(80);
+        for (int i = 0; i < count + alike.size(); ++i) {
+            QString name;
+            const int length = 1 + pick(4);
+            for (int k = 0; k < length; ++k)
+                name += pieces[pick(pieces.size())];
+            if (i >= count)
+                name = alike[i - count];
+            if (name.trimmed().isEmpty() || used.contains(name))
+                continue;
+            used.insert(name);
+            QString child = QStringLiteral("{\"name\":\"%1\",\"mimeType\":\"%2\"").arg(name, mimeTypes[pick(mimeTypes.size())]);
+            if (pick(6) == 0) {
+                child += QStringLiteral(",\"permissions\":{\"u\":[\"Copy\"]}");
+                unreadable.insert(name);
+            }
+            children += (children.isEmpty() ? QString() : QStringLiteral(",")) + child + QLatin1Char('}');
+        }
+        const QByteArray json = (QStringLiteral("{\"users\":[{\"name\":\"u\",\"password\":\"u\"}],\"root\":{\"id\":\"R\","
+                                                "\"name\":\"Root\",\"mimeType\":\"workspace\",\"permissions\":{\"*\":[\"All\"]},"
+                                                "\"children\":[{\"id\":\"F\",\"name\":\"F\",\"mimeType\":\"bin\",\"children\":[")
+                                 + children + QStringLiteral("]}]}}"))
+                                    .toUtf8();
+        QString error;
+        const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::fromJson(json, QStringLiteral("random.json"), &error);
+        ASSERT_TRUE(tree) << error.toStdString();
+
+        QList<NodeSP> expected;
+        for (const NodeSP& node : Zel_MemoryTree::childSnapshots(tree, m("F"), QStringLiteral("u"))) {
+            if (!unreadable.contains(node->getName()))
+                expected << node;
+        }
+        std::stable_sort(expected.begin(), expected.end(), [](const NodeSP& a, const NodeSP& b) { return *a < *b; });
+        QStringList expectedMonikers;
+        for (const NodeSP& node : expected)
+            expectedMonikers << node->getMoniker();
+
+        Orv_Engine engine(2);
+        boost::shared_ptr<Zel_MemorySession> session(new Zel_MemorySession(tree, &engine));
+        auto login = rec<LoginRec>();
+        session->submitRequest(session->makeLoginReqSP(QStringLiteral("u"), QStringLiteral("u"), {}, login));
+        engine.DeliverAll(); // logged in before the requests that need it run
+        auto answered = rec<NodeRec>();
+        session->submitRequest(session->makeGetChildrenReqSP(mk(m("F")), answered));
+        auto flagged = rec<ChildrenRec>();
+        session->submitRequest(session->makeChildrenReqSP(mk(m("F")), flagged));
+        engine.DeliverAll();
+        ASSERT_EQ(QStringList{QStringLiteral("ok u")}, login->log);
+        QStringList answeredMonikers;
+        for (const NodeSP& node : answered->nodes)
+            answeredMonikers << node->getMoniker();
+        EXPECT_EQ(expectedMonikers, answeredMonikers);
+        QStringList flaggedMonikers;
+        for (const NodeSP& node : flagged->nodes)
+            flaggedMonikers << node->getMoniker();
+        EXPECT_EQ(expectedMonikers, flaggedMonikers);
+        EXPECT_EQ(used.size() - unreadable.size(), expectedMonikers.size());
+    }
+}
+
+TEST_F(Zel_MemorySessionTest, CancelAllReachesEveryLiveRequestAmongManyMadeAndDropped)
+{
+    // The session forgets requests that are gone only now and then; however
+    // many were made and dropped in between, every request still alive is
+    // cancelled, and one made afterwards runs.
+    auto cancelled = rec<NodeRec>();
+    std::vector<boost::shared_ptr<Zel_GetNodeReq>> kept;
+    for (int i = 0; i < 1000; ++i) {
+        boost::shared_ptr<Zel_GetNodeReq> request = session->makeGetNodeReqSP(mk(m(Mayor)), cancelled);
+        if (i % 7 == 0)
+            kept.push_back(request);
+    }
+    session->cancelAllRequests();
+    auto after = rec<NodeRec>();
+    boost::shared_ptr<Zel_GetNodeReq> later = session->makeGetNodeReqSP(mk(m(Mayor)), after);
+    for (const boost::shared_ptr<Zel_GetNodeReq>& request : kept)
+        run(request);
+    run(later);
+
+    QStringList expected;
+    for (std::size_t i = 0; i < kept.size(); ++i)
+        expected << QStringLiteral("fail %1").arg(Zel_MemoryErrorCodes::Cancelled) << QStringLiteral("finished");
+    EXPECT_EQ(expected, cancelled->log);
+    EXPECT_EQ(QStringLiteral("finished"), after->log.value(1));
+    EXPECT_TRUE(after->log.value(0).startsWith(QStringLiteral("ok "))) << after->log.join(QLatin1Char('|')).toStdString();
 }
 
 TEST_F(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives)

@@ -2,17 +2,15 @@
 // files rejected with the file's name and the position of the fault.
 #include "Zel_MemoryLimits.h"
 #include "Zel_MemoryTree.h"
+#include "Zel_Node.h"
 
 #include <QDir>
-#include <QElapsedTimer>
-#include <QJsonDocument>
 #include <QSet>
 #include <QFile>
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
 
-#include <functional>
 
 namespace {
 
@@ -149,19 +147,6 @@ QByteArray withProject(const QByteArray& members)
     return json;
 }
 
-// A root folder with the given number of bins in it.
-QByteArray wideTree(int children)
-{
-    QByteArray json = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":[\n";
-    for (int i = 0; i < children; ++i) {
-        if (i > 0)
-            json += ",\n";
-        json += "{\"name\":\"Bin " + QByteArray::number(i) + "\",\"mimeType\":\"bin\"}";
-    }
-    json += "]}}";
-    return json;
-}
-
 // A chain of bins, the deepest at the given depth below the root.
 QByteArray deepTree(int depth)
 {
@@ -242,6 +227,37 @@ TEST(Zel_MemoryTreeTest, UnknownKeyTypeIsRefused)
               loadError(json));
 }
 
+TEST(Zel_MemoryTreeTest, PathsInMessagesNameTheNodeAmongManyAndDeepInTheTree)
+{
+    // A node's path is written out only for a message: it must still count
+    // the children of every folder on the way, in file order.
+    auto tree = [](const QByteArray& last) {
+        QByteArray json = "{\"users\":[{\"name\":\"u\"}],\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":[";
+        for (int i = 0; i < 3; ++i)
+            json += "{\"name\":\"Bin " + QByteArray::number(i) + "\",\"mimeType\":\"bin\"},";
+        json += "{\"id\":\"F\",\"name\":\"Folder\",\"mimeType\":\"bin\",\"children\":[";
+        for (int i = 0; i < 20; ++i)
+            json += "{\"name\":\"Clip " + QByteArray::number(i) + "\",\"mimeType\":\"masterclip\"},";
+        json += last + "]}]}}";
+        return json;
+    };
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].name: a second child named \"Clip 7\" in \"Folder\""),
+              loadError(tree("{\"name\":\"Clip 7\",\"mimeType\":\"masterclip\"}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].properties.Name: set by \"name\", \"mimeType\" and "
+                             "\"mobID\", not as a property"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"properties\":{\"Name\":\"Y\"}}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].properties.Tape.value: expected a string"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"properties\":{\"Tape\":{\"value\":1}}}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].reservation.since: \"soon\" is not an ISO 8601 "
+                             "date and time"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"reservation\":{\"user\":\"u\",\"since\":\"soon\"}}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].locators[0].id: missing"),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"masterclip\",\"locators\":[{}]}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20].master: no node has the moniker or ID \"Z\""),
+              loadError(tree("{\"name\":\"X\",\"mimeType\":\"subclip\",\"master\":\"Z\"}")));
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[3].children[20]: expected an object"), loadError(tree("7")));
+}
+
 TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
 {
     // A second "children" would silently replace the first subtree.
@@ -258,6 +274,19 @@ TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
     EXPECT_EQ(QStringLiteral("tree.json:1:32: a second member named \"name\" in one object (the first is at 1:19)"),
               loadError(escaped));
 
+    // Objects with many names are searched as thoroughly as small ones, and a
+    // name written with an escape is the same as one written plainly.
+    QByteArray many = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"settings\":{";
+    for (int i = 0; i < 40; ++i)
+        many += "\"k" + QByteArray::number(i) + "\":\"v\",";
+    EXPECT_EQ(QStringLiteral("tree.json:1:458: a second member named \"k17\" in one object (the first is at 1:228)"),
+              loadError(many + "\"k\\u00317\":\"w\"}}}"));
+    EXPECT_EQ(QStringLiteral("tree.json:1:458: a second member named \"k3\" in one object (the first is at 1:95)"),
+              loadError(many + "\"k3\":\"w\"}}}"));
+    const QByteArray plainAfterEscaped = "{\"root\":{\"n\\u0061me\":\"Root\",\"name\":\"Root\"}}";
+    EXPECT_EQ(QStringLiteral("tree.json:1:29: a second member named \"name\" in one object (the first is at 1:10)"),
+              loadError(plainAfterEscaped));
+
     // A text broken near the second name is a syntax error, not a duplicate.
     const QString broken = loadError("{\"root\":{}, \"root\" {}}");
     EXPECT_TRUE(broken.startsWith(QStringLiteral("tree.json:1:")) && !broken.contains(QStringLiteral("second member")))
@@ -268,6 +297,44 @@ TEST(Zel_MemoryTreeTest, MemberGivenTwiceInOneObjectIsRefusedWithBothPositions)
         "{\"root\":{\"id\":\"id\",\"name\":\"name\",\"mimeType\":\"workspace\",\"children\":["
         "{\"id\":\"A\",\"name\":\"children\",\"mimeType\":\"bin\"},{\"id\":\"B\",\"name\":\"B\",\"mimeType\":\"bin\"}]}}",
         QStringLiteral("tree.json")));
+}
+
+TEST(Zel_MemoryTreeTest, EveryMonikerNamesOneNodeWhetherGivenOrMadeFromTheId)
+{
+    // Bins X (moniker made from its ID), Y (a moniker of its own) and Z (its
+    // own moniker, the same as the one made from its ID), each with a clip.
+    const QByteArray json = "{\"users\":[{\"name\":\"u\"}],\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":["
+                            "{\"id\":\"X\",\"name\":\"X\",\"mimeType\":\"bin\",\"children\":[{\"name\":\"in X\",\"mimeType\":\"clip\"}]},"
+                            "{\"id\":\"Y\",\"moniker\":\"zel-mem://elsewhere\",\"name\":\"Y\",\"mimeType\":\"bin\","
+                            "\"children\":[{\"name\":\"in Y\",\"mimeType\":\"clip\"}]},"
+                            "{\"id\":\"Z\",\"moniker\":\"zel-mem://Z\",\"name\":\"Z\",\"mimeType\":\"bin\","
+                            "\"children\":[{\"name\":\"in Z\",\"mimeType\":\"clip\"}]}]}}";
+    QString error;
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::fromJson(json, QStringLiteral("tree.json"), &error);
+    ASSERT_TRUE(tree) << error.toStdString();
+    auto childOf = [&tree](const char* moniker) {
+        const QList<boost::shared_ptr<Zel_Node>> children =
+            Zel_MemoryTree::childSnapshots(tree, QLatin1String(moniker), QStringLiteral("u"));
+        return children.size() == 1 ? children.at(0)->getName() : QStringLiteral("%1 children").arg(children.size());
+    };
+    EXPECT_EQ(QStringLiteral("in X"), childOf("zel-mem://X"));
+    EXPECT_EQ(QStringLiteral("in Y"), childOf("zel-mem://elsewhere"));
+    EXPECT_EQ(QStringLiteral("0 children"), childOf("zel-mem://Y")) << "Y's moniker is another one";
+    EXPECT_EQ(QStringLiteral("in Z"), childOf("zel-mem://Z"));
+    EXPECT_EQ(QStringLiteral("zel-mem://elsewhere"), tree->monikerAt(QStringLiteral("/Y")));
+
+    // A moniker given to one node and made from another's ID is refused,
+    // whichever comes first.
+    const QByteArray madeFirst = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":["
+                                 "{\"id\":\"Y\",\"name\":\"A\",\"mimeType\":\"bin\"},"
+                                 "{\"id\":\"B\",\"moniker\":\"zel-mem://Y\",\"name\":\"B\",\"mimeType\":\"bin\"}]}}";
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[1].moniker: a second node with the moniker \"zel-mem://Y\""),
+              loadError(madeFirst));
+    const QByteArray givenFirst = "{\"root\":{\"id\":\"R\",\"name\":\"Root\",\"mimeType\":\"workspace\",\"children\":["
+                                  "{\"id\":\"B\",\"moniker\":\"zel-mem://Y\",\"name\":\"B\",\"mimeType\":\"bin\"},"
+                                  "{\"id\":\"Y\",\"name\":\"A\",\"mimeType\":\"bin\"}]}}";
+    EXPECT_EQ(QStringLiteral("tree.json: root.children[1].moniker: a second node with the moniker \"zel-mem://Y\""),
+              loadError(givenFirst));
 }
 
 TEST(Zel_MemoryTreeTest, GeneratedIdsAvoidIdsGivenLaterInTheFile)
@@ -315,36 +382,3 @@ TEST(Zel_MemoryTreeTest, SettingsBeyondTheSettingsLimitsAreRefused)
               loadError(json));
 }
 
-TEST(Zel_MemoryTreeTest, LoadingTimeGrowsLinearlyWithTheChildrenOfAFolder)
-{
-    // Loading is measured against Qt's own parse of the same text, which is
-    // linear: the load's cost per unit of parse may not grow much when the
-    // folder grows tenfold (a quadratic load would grow it tenfold; up to
-    // twofold is seen on a busy machine).
-    // Comparing with the parse in the same run keeps caches and a busy
-    // machine from deciding the outcome. Best of three runs each.
-    auto best = [](const std::function<void()>& work) {
-        qint64 fastest = -1;
-        for (int run = 0; run < 3; ++run) {
-            QElapsedTimer timer;
-            timer.start();
-            work();
-            const qint64 elapsed = timer.nsecsElapsed();
-            if (fastest < 0 || elapsed < fastest)
-                fastest = elapsed;
-        }
-        return static_cast<double>(fastest);
-    };
-    auto loadPerParse = [&best](int children) {
-        const QByteArray json = wideTree(children);
-        const double load = best([&] {
-            boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::fromJson(json, QStringLiteral("wide.json"));
-            EXPECT_TRUE(tree && tree->nodeCount() == children + 1);
-        });
-        const double parse = best([&] { EXPECT_FALSE(QJsonDocument::fromJson(json).isNull()); });
-        return load / parse;
-    };
-    const double small = loadPerParse(20000);
-    const double large = loadPerParse(200000);
-    EXPECT_LT(large / small, 5.0) << "load per parse: 20,000 children " << small << ", 200,000 children " << large;
-}
