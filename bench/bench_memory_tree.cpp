@@ -22,6 +22,7 @@
 // The engine rows and their floors count the CPU time of every thread of the
 // process, so that the workers' share is not left out.
 #include "BenchSupport.h"
+#include "CountingNodeCB.h"
 
 #include "Orv_Engine.h"
 #include "Orv_Result.h"
@@ -94,26 +95,6 @@ boost::shared_ptr<Zel_MemoryTree> loadTree(const QByteArray& json)
     check(tree != nullptr, "the tree does not load");
     return tree;
 }
-
-class CountingNodeCB : public Zel_ResultCB
-{
-public:
-    void succeeded(boost::shared_ptr<Zel_Node> node) override
-    {
-        benchmark::DoNotOptimize(node.get());
-        ++mSucceeded;
-    }
-    void failed(boost::shared_ptr<Zel_Error> error) override
-    {
-        benchmark::DoNotOptimize(error.get());
-        ++mFailed;
-    }
-    void finished() override { ++mFinished; }
-
-    long mSucceeded = 0;
-    long mFailed = 0;
-    long mFinished = 0;
-};
 
 class LoginCB : public Zel_LoginCB
 {

@@ -12,6 +12,7 @@
 //                                          DeliverPending), the bare queue (Push, TryPop,
 //                                          deliverNext), deliverNext alone, and the floor
 #include "BenchSupport.h"
+#include "CountingNodeCB.h"
 
 #include "Orv_Engine.h"
 #include "Orv_ResultQ.h"
@@ -33,26 +34,6 @@
 namespace {
 
 // Handlers that do the least an application would: look at the payload.
-class CountingNodeCB : public Zel_ResultCB
-{
-public:
-    void succeeded(boost::shared_ptr<Zel_Node> node) override
-    {
-        benchmark::DoNotOptimize(node.get());
-        ++mSucceeded;
-    }
-    void failed(boost::shared_ptr<Zel_Error> error) override
-    {
-        benchmark::DoNotOptimize(error.get());
-        ++mFailed;
-    }
-    void finished() override { ++mFinished; }
-
-    long mSucceeded = 0;
-    long mFailed = 0;
-    long mFinished = 0;
-};
-
 class CountingSettingsCB : public Zel_SettingsCB
 {
 public:
