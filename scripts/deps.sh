@@ -4,7 +4,8 @@
 set -euo pipefail
 
 qt_major="${1:-5}"
-packages=(g++ cmake make pkg-config libboost-dev libgtest-dev libgmock-dev libbenchmark-dev valgrind locales)
+packages=(g++ cmake make pkg-config libboost-dev libgtest-dev libgmock-dev libbenchmark-dev valgrind locales
+  abigail-tools)
 if [ "$qt_major" = 6 ]; then
   packages+=(qt6-base-dev qt6-5compat-dev)
 else
