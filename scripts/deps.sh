@@ -20,9 +20,15 @@ for p in "${packages[@]}"; do
   dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q "install ok installed" || missing+=("$p")
 done
 if [ ${#missing[@]} -gt 0 ]; then
-  echo "Installing missing packages: ${missing[*]}"
+  echo "== Installing missing packages: ${missing[*]}"
+  echo "== Updating the package lists"
   $sudo apt-get update -qq
-  DEBIAN_FRONTEND=noninteractive $sudo apt-get install -y -qq --no-install-recommends "${missing[@]}" >/dev/null
+  echo "== Downloading and installing ${#missing[@]} packages (a few minutes on a fresh machine)"
+  if ! DEBIAN_FRONTEND=noninteractive $sudo apt-get install -y -q --no-install-recommends "${missing[@]}" 2>&1 \
+    | { grep --line-buffered -E '^(Setting up|E:)' || true; }; then
+    echo "deps: apt-get install failed" >&2
+    exit 1
+  fi
 fi
 
 # The locale tests run under de_DE.UTF-8: generate it when it is missing.
