@@ -1,0 +1,74 @@
+#include "sql_connection_p.h"
+
+#include <atomic>
+
+namespace ZelSql {
+
+Dialect::~Dialect() = default;
+
+namespace {
+std::atomic<unsigned long long> connectionCounter{0};
+}
+
+Connection::Connection(const Dialect& dialect, const QString& driver)
+    : mDialect(dialect),
+      mName(QStringLiteral("zel-store-%1-%2").arg(driver).arg(++connectionCounter))
+{
+    if (!QSqlDatabase::isDriverAvailable(driver)) {
+        throw StoreError(StoreError::Internal,
+                         QStringLiteral("%1: the Qt SQL driver %2 is not installed").arg(dialect.name(), driver));
+    }
+    mDatabase = QSqlDatabase::addDatabase(driver, mName);
+}
+
+Connection::~Connection()
+{
+    mDatabase.close();
+    // removeDatabase wants no QSqlDatabase of the name left anywhere.
+    mDatabase = QSqlDatabase();
+    QSqlDatabase::removeDatabase(mName);
+}
+
+QSqlQuery Connection::exec(const QString& sql, const QVariantList& values)
+{
+    QSqlQuery query(mDatabase);
+    query.setForwardOnly(true);
+    bool ok;
+    if (values.isEmpty()) {
+        ok = query.exec(sql);
+    } else {
+        ok = query.prepare(sql);
+        if (ok) {
+            for (const QVariant& value : values)
+                query.addBindValue(value);
+            ok = query.exec();
+        }
+    }
+    if (!ok)
+        throw mDialect.mapError(query.lastError(), *this, sql, false);
+    return query;
+}
+
+QVariant Connection::value(const QString& sql, const QVariantList& values)
+{
+    QSqlQuery query = exec(sql, values);
+    return query.next() ? query.value(0) : QVariant();
+}
+
+void Connection::commit()
+{
+    QSqlQuery query(mDatabase);
+    if (!query.exec(QStringLiteral("COMMIT")))
+        throw mDialect.mapError(query.lastError(), *this, QStringLiteral("COMMIT"), true);
+}
+
+void Connection::rollback() noexcept
+{
+    try {
+        QSqlQuery query(mDatabase);
+        query.exec(QStringLiteral("ROLLBACK"));
+    } catch (...) {
+    }
+}
+
+} // namespace ZelSql
