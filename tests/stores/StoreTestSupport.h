@@ -93,6 +93,20 @@ private:
 // Runs one statement on the test cluster's own database (zel).
 void adminExec(const QString& sql);
 
+// --- Checks that hold for the schema in every dialect. ---
+
+// The tables of a store, sorted.
+QStringList sortedTables(ZelSql::Connection& connection);
+// The tables this build creates, sorted.
+QStringList expectedTables();
+// Inserts a node row (position: the next among its siblings) and answers
+// its nid; parentNid 0 makes a root.
+qint64 insertNode(ZelSql::Connection& connection, const QString& id, qint64 parentNid, const QString& name);
+qint64 count(ZelSql::Connection& connection, const QString& sql, const QVariantList& values = QVariantList());
+// Unique sibling names, foreign keys, cascading subtree removal, children
+// in order, and the journal's numbering, on a store just created.
+void expectSchemaRules(ZelSql::Connection& connection);
+
 } // namespace StoreTest
 
 #endif

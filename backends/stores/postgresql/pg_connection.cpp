@@ -99,6 +99,7 @@ public:
         QStringList names;
         while (query.next())
             names << query.value(0).toString();
+        connection.checkRows(query, QStringLiteral("pg_tables"));
         return names;
     }
 
@@ -247,15 +248,13 @@ std::unique_ptr<Connection> openPostgresqlConnection(const StoreUrl& url)
     return connection;
 }
 
-std::unique_ptr<Connection> openPostgresqlStore(const StoreUrl& url, const SchemaPlan* plan)
+std::unique_ptr<Connection> openPostgresqlStore(const StoreUrl& url, const SchemaPlan* plan, SchemaOutcome* outcome)
 {
     std::unique_ptr<Connection> connection = openPostgresqlConnection(url);
-    if (plan) {
-        ensureSchema(*connection, *plan);
-    } else {
-        const SchemaPlan current = currentSchemaPlan(*connection);
-        ensureSchema(*connection, current);
-    }
+    const SchemaPlan current = plan ? SchemaPlan() : currentSchemaPlan(*connection);
+    const SchemaOutcome done = ensureSchema(*connection, plan ? *plan : current);
+    if (outcome)
+        *outcome = done;
     return connection;
 }
 

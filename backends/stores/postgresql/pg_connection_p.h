@@ -39,8 +39,10 @@ const Dialect& postgresqlDialect();
 std::unique_ptr<Connection> openPostgresqlConnection(const StoreUrl& url);
 
 // A connection to a ready store: openPostgresqlConnection, then ensureSchema
-// with the plan (this build's when none is given).
-std::unique_ptr<Connection> openPostgresqlStore(const StoreUrl& url, const SchemaPlan* plan = nullptr);
+// with the plan (this build's when none is given); what ensureSchema found
+// and did goes to outcome when given.
+std::unique_ptr<Connection> openPostgresqlStore(const StoreUrl& url, const SchemaPlan* plan = nullptr,
+                                                SchemaOutcome* outcome = nullptr);
 
 // Begins a change transaction: SERIALIZABLE.
 void beginPostgresqlWrite(Connection& connection);

@@ -49,10 +49,19 @@ QSqlQuery Connection::exec(const QString& sql, const QVariantList& values)
     return query;
 }
 
+void Connection::checkRows(const QSqlQuery& query, const QString& sql)
+{
+    if (query.lastError().isValid())
+        throw mDialect.mapError(query.lastError(), *this, sql, false);
+}
+
 QVariant Connection::value(const QString& sql, const QVariantList& values)
 {
     QSqlQuery query = exec(sql, values);
-    return query.next() ? query.value(0) : QVariant();
+    if (query.next())
+        return query.value(0);
+    checkRows(query, sql);
+    return QVariant();
 }
 
 void Connection::commit()

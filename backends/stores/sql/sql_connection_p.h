@@ -61,6 +61,9 @@ public:
     // query, positioned before its first row. A statement without values is
     // run unprepared (DDL and transaction control cannot be prepared).
     QSqlQuery exec(const QString& sql, const QVariantList& values = QVariantList());
+    // Throws the error that ended a query's rows early: QSqlQuery::next()
+    // answers false both at the end and on an error met while stepping.
+    void checkRows(const QSqlQuery& query, const QString& sql);
     // The first column of the first row, or a null QVariant when there is none.
     QVariant value(const QString& sql, const QVariantList& values = QVariantList());
     // COMMIT: a connection lost here is OutcomeUnknown.

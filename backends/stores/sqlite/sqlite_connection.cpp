@@ -77,6 +77,7 @@ public:
         QStringList names;
         while (query.next())
             names << query.value(0).toString();
+        connection.checkRows(query, QStringLiteral("sqlite_master"));
         return names;
     }
 
@@ -162,7 +163,8 @@ std::unique_ptr<Connection> openSqliteConnection(const QString& path, const Sqli
     return connection;
 }
 
-std::unique_ptr<Connection> openSqliteStore(const QString& path, const SqliteOptions& options, const SchemaPlan* plan)
+std::unique_ptr<Connection> openSqliteStore(const QString& path, const SqliteOptions& options, const SchemaPlan* plan,
+                                            SchemaOutcome* outcome)
 {
     std::unique_ptr<Connection> connection = openSqliteConnection(path, options);
     const SchemaPlan current = plan ? SchemaPlan() : currentSchemaPlan(*connection);
@@ -180,7 +182,9 @@ std::unique_ptr<Connection> openSqliteStore(const QString& path, const SqliteOpt
                              QStringLiteral("SQLite: the store file %1 cannot use WAL mode (journal mode stays \"%2\")").arg(path, mode));
         }
     }
-    ensureSchema(*connection, wanted);
+    const SchemaOutcome done = ensureSchema(*connection, wanted);
+    if (outcome)
+        *outcome = done;
     return connection;
 }
 

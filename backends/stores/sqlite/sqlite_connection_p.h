@@ -36,9 +36,10 @@ const Dialect& sqliteDialect();
 std::unique_ptr<Connection> openSqliteConnection(const QString& path, const SqliteOptions& options = SqliteOptions());
 
 // A connection to a ready store: openSqliteConnection, then WAL mode and
-// ensureSchema with the plan (this build's when none is given).
+// ensureSchema with the plan (this build's when none is given); what
+// ensureSchema found and did goes to outcome when given.
 std::unique_ptr<Connection> openSqliteStore(const QString& path, const SqliteOptions& options = SqliteOptions(),
-                                            const SchemaPlan* plan = nullptr);
+                                            const SchemaPlan* plan = nullptr, SchemaOutcome* outcome = nullptr);
 
 // Begins a write transaction (BEGIN IMMEDIATE: takes the write lock now, so
 // the transaction never fails later for a write lock it cannot get).
