@@ -23,6 +23,7 @@ Connection::Connection(const Dialect& dialect, const QString& driver)
 
 Connection::~Connection()
 {
+    mFailed = QSqlQuery();
     mDatabase.close();
     // removeDatabase wants no QSqlDatabase of the name left anywhere.
     mDatabase = QSqlDatabase();
@@ -44,8 +45,11 @@ QSqlQuery Connection::exec(const QString& sql, const QVariantList& values)
             ok = query.exec();
         }
     }
-    if (!ok)
-        throw mDialect.mapError(query.lastError(), *this, sql, false);
+    if (!ok) {
+        StoreError error = mDialect.mapError(query.lastError(), *this, sql, false);
+        mFailed = query;
+        throw error;
+    }
     return query;
 }
 
@@ -76,6 +80,7 @@ void Connection::rollback() noexcept
     try {
         QSqlQuery query(mDatabase);
         query.exec(QStringLiteral("ROLLBACK"));
+        mFailed = QSqlQuery();
     } catch (...) {
     }
 }

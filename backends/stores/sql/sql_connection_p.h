@@ -68,7 +68,8 @@ public:
     QVariant value(const QString& sql, const QVariantList& values = QVariantList());
     // COMMIT: a connection lost here is OutcomeUnknown.
     void commit();
-    // ROLLBACK, ignoring failures (a lost connection has no transaction left).
+    // ROLLBACK, ignoring failures (a lost connection has no transaction left);
+    // then frees the statement that failed, if any.
     void rollback() noexcept;
 
 private:
@@ -78,6 +79,10 @@ private:
     const Dialect& mDialect;
     QString mName;
     QSqlDatabase mDatabase;
+    // The last statement that failed, kept until the transaction has ended:
+    // the driver frees a prepared statement when its query is destroyed,
+    // which an aborted PostgreSQL transaction refuses.
+    QSqlQuery mFailed;
 };
 
 } // namespace ZelSql
