@@ -24,6 +24,12 @@ const int ConnectTimeoutMs = 10000;
 const char* const KeepaliveDefaults[][2] = {
     {"keepalives", "1"}, {"keepalives_idle", "5"}, {"keepalives_interval", "2"}, {"keepalives_count", "3"}};
 
+// The server's notices (such as the reason it gives when it ends the
+// connection) are the owner's business through lost(), not stderr's.
+void ignoreNotice(void*, const char*)
+{
+}
+
 QString libpqError(PGconn* connection)
 {
     return connection ? QString::fromUtf8(PQerrorMessage(connection)).trimmed() : QStringLiteral("out of memory");
@@ -82,6 +88,7 @@ struct PgListener::Private {
             PQfinish(attempt);
             return Failed;
         }
+        PQsetNoticeProcessor(attempt, ignoreNotice, nullptr);
         PostgresPollingStatusType status = PGRES_POLLING_WRITING;
         while (status != PGRES_POLLING_OK) {
             if (status == PGRES_POLLING_FAILED) {
