@@ -5,7 +5,10 @@
 // connection in the process has and removed when the Connection is destroyed.
 // Qt SQL connections belong to the thread that made them: a Connection is
 // made, used and destroyed on one thread (each thread of a store opens its
-// own). Every statement binds its values; none is ever assembled from data.
+// own). Qt SQL's driver loader is a QObject of the first thread that asks for
+// a driver and lives as long as the process: when that is a thread not made
+// by Qt, Qt keeps that thread's data to the end (a few hundred bytes), so the
+// first Connection is best made on the main thread. Every statement binds its values; none is ever assembled from data.
 // Failures are thrown as StoreError, mapped by the connection's Dialect.
 #ifndef SQL_CONNECTION_P_H
 #define SQL_CONNECTION_P_H
