@@ -19,6 +19,7 @@ cluster=""
 cleanup() {
   if [ -n "$cluster" ]; then
     "$script" stop "$cluster" || true
+    rm -rf "$cluster" "$cluster.log"
     cluster=""
   fi
 }
@@ -41,6 +42,7 @@ else
   sed 's/^/  /' "$dir.log" >&2 || true
   rm -f "$dir.log"
   "$script" stop "$dir" >/dev/null 2>&1 || true
+  rm -rf "$dir"
   cluster=""
   unset ZEL_TEST_POSTGRESQL_URL ZEL_TEST_POSTGRESQL_CLUSTER ZEL_TEST_POSTGRESQL_SCRIPT
 fi
