@@ -111,6 +111,8 @@ public:
         connection.exec(QStringLiteral("SELECT pg_advisory_xact_lock(?)"), {QVariant(SchemaLockKey)});
     }
 
+    void beforeJournalWrite(Connection& connection) const override { lockPostgresqlJournal(connection); }
+
     StoreError mapError(const QSqlError& error, Connection& connection, const QString& statement,
                         bool commit) const override
     {
@@ -266,6 +268,11 @@ void beginPostgresqlWrite(Connection& connection)
 void lockPostgresqlJournal(Connection& connection)
 {
     connection.exec(QStringLiteral("SELECT pg_advisory_xact_lock(?)"), {QVariant(JournalLockKey)});
+}
+
+void publishPostgresqlChanges(Connection& connection, const QByteArray& channel, qint64 lastSeq)
+{
+    connection.exec(QStringLiteral("SELECT pg_notify(?, ?)"), {QString::fromLatin1(channel), QString::number(lastSeq)});
 }
 
 } // namespace ZelSql

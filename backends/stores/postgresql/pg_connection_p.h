@@ -46,8 +46,15 @@ std::unique_ptr<Connection> openPostgresqlStore(const StoreUrl& url, const Schem
 
 // Begins a change transaction: SERIALIZABLE.
 void beginPostgresqlWrite(Connection& connection);
-// Takes the journal lock inside the current transaction.
+// Takes the journal lock inside the current transaction (appendToJournal
+// does it through the dialect).
 void lockPostgresqlJournal(Connection& connection);
+// NOTIFY in the current transaction: the channel hears lastSeq, the number
+// of the transaction's last journal entry, when (and only if) it commits.
+void publishPostgresqlChanges(Connection& connection, const QByteArray& channel, qint64 lastSeq);
+
+// The notification channel of a store's changes.
+const char* const ChangeChannel = "zel_changes";
 
 // The error for a connection that libpq could not make, from its message:
 // which server (socket folder or host and port), and what went wrong.

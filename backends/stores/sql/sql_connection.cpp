@@ -6,6 +6,10 @@ namespace ZelSql {
 
 Dialect::~Dialect() = default;
 
+void Dialect::beforeJournalWrite(Connection&) const
+{
+}
+
 namespace {
 std::atomic<unsigned long long> connectionCounter{0};
 }
@@ -23,6 +27,7 @@ Connection::Connection(const Dialect& dialect, const QString& driver)
 
 Connection::~Connection()
 {
+    mPrepared.clear();
     mFailed = QSqlQuery();
     mDatabase.close();
     // removeDatabase wants no QSqlDatabase of the name left anywhere.
@@ -50,6 +55,24 @@ QSqlQuery Connection::exec(const QString& sql, const QVariantList& values)
         mFailed = query;
         throw error;
     }
+    return query;
+}
+
+QSqlQuery& Connection::execPrepared(const QString& sql, const QVariantList& values)
+{
+    auto found = mPrepared.find(sql);
+    if (found == mPrepared.end()) {
+        QSqlQuery query(mDatabase);
+        query.setForwardOnly(true);
+        if (!query.prepare(sql))
+            throw mDialect.mapError(query.lastError(), *this, sql, false);
+        found = mPrepared.emplace(sql, query).first;
+    }
+    QSqlQuery& query = found->second;
+    for (int i = 0; i < values.size(); ++i)
+        query.bindValue(i, values.at(i));
+    if (!query.exec())
+        throw mDialect.mapError(query.lastError(), *this, sql, false);
     return query;
 }
 

@@ -23,6 +23,8 @@
 #include <QVariant>
 #include <QVariantList>
 
+#include <unordered_map>
+
 namespace ZelSql {
 
 class Connection;
@@ -41,6 +43,9 @@ public:
     // Begins a transaction for a schema change that holds every other
     // schema change off until it ends (also in other processes).
     virtual void beginSchemaChange(Connection& connection) const = 0;
+    // Called in a write transaction before its first change_journal row:
+    // whatever makes the journal's numbers follow commit order.
+    virtual void beforeJournalWrite(Connection& connection) const;
     // The StoreError for a failed statement; commit is true when the
     // statement was the COMMIT of a transaction.
     virtual StoreError mapError(const QSqlError& error, Connection& connection, const QString& statement,
@@ -64,6 +69,11 @@ public:
     // query, positioned before its first row. A statement without values is
     // run unprepared (DDL and transaction control cannot be prepared).
     QSqlQuery exec(const QString& sql, const QVariantList& values = QVariantList());
+    // The same for a statement of the hot path: prepared once and kept for
+    // the connection's life, bound and run again on each call. The answer is
+    // the kept query itself: read its rows, then finish() it (SQLite cannot
+    // commit while a statement has rows left to give).
+    QSqlQuery& execPrepared(const QString& sql, const QVariantList& values);
     // Throws the error that ended a query's rows early: QSqlQuery::next()
     // answers false both at the end and on an error met while stepping.
     void checkRows(const QSqlQuery& query, const QString& sql);
@@ -86,6 +96,11 @@ private:
     // the driver frees a prepared statement when its query is destroyed,
     // which an aborted PostgreSQL transaction refuses.
     QSqlQuery mFailed;
+    struct TextHash {
+        std::size_t operator()(const QString& text) const { return qHash(text); }
+    };
+    // The prepared statements of execPrepared, by their text.
+    std::unordered_map<QString, QSqlQuery, TextHash> mPrepared;
 };
 
 } // namespace ZelSql
