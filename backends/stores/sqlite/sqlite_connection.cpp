@@ -1,7 +1,9 @@
 #include "sqlite_connection_p.h"
 
 #include <QDir>
+#include <QElapsedTimer>
 #include <QFileInfo>
+#include <QThread>
 
 namespace ZelSql {
 
@@ -163,6 +165,34 @@ std::unique_ptr<Connection> openSqliteConnection(const QString& path, const Sqli
     return connection;
 }
 
+namespace {
+
+// WAL mode and the schema, once.
+SchemaOutcome prepareStore(Connection& connection, const QString& path, const SchemaPlan& wanted)
+{
+    // WAL is a lasting property of the file: set it only on an empty file or
+    // on a zel store this build can use, never on someone else's database.
+    const QStringList tables = sqliteDialect().tables(connection);
+    const bool ours = tables.isEmpty()
+        || (tables.contains(QLatin1String(MetaTable)) && storedSchemaVersion(connection) <= wanted.version);
+    if (ours && path != QLatin1String(":memory:")) {
+        const QString mode = connection.value(QStringLiteral("PRAGMA journal_mode = WAL")).toString();
+        if (mode.compare(QLatin1String("wal"), Qt::CaseInsensitive) != 0) {
+            throw StoreError(StoreError::StoreUnavailable,
+                             QStringLiteral("SQLite: the store file %1 cannot use WAL mode (journal mode stays \"%2\")").arg(path, mode));
+        }
+    }
+    return ensureSchema(connection, wanted);
+}
+
+bool isBusy(const StoreError& error)
+{
+    const int primary = error.nativeCode().toInt() & 0xff;
+    return primary == SqliteBusy || primary == SqliteLocked;
+}
+
+} // namespace
+
 std::unique_ptr<Connection> openSqliteStore(const QString& path, const SqliteOptions& options, const SchemaPlan* plan,
                                             SchemaOutcome* outcome)
 {
@@ -170,22 +200,24 @@ std::unique_ptr<Connection> openSqliteStore(const QString& path, const SqliteOpt
     const SchemaPlan current = plan ? SchemaPlan() : currentSchemaPlan(*connection);
     const SchemaPlan& wanted = plan ? *plan : current;
 
-    // WAL is a lasting property of the file: set it only on an empty file or
-    // on a zel store this build can use, never on someone else's database.
-    const QStringList tables = sqliteDialect().tables(*connection);
-    const bool ours = tables.isEmpty()
-        || (tables.contains(QLatin1String(MetaTable)) && storedSchemaVersion(*connection) <= wanted.version);
-    if (ours && path != QLatin1String(":memory:")) {
-        const QString mode = connection->value(QStringLiteral("PRAGMA journal_mode = WAL")).toString();
-        if (mode.compare(QLatin1String("wal"), Qt::CaseInsensitive) != 0) {
-            throw StoreError(StoreError::StoreUnavailable,
-                             QStringLiteral("SQLite: the store file %1 cannot use WAL mode (journal mode stays \"%2\")").arg(path, mode));
+    // Connections opening a new file together can meet in SQLite's deadlock
+    // guard (one switching to WAL while another creates the schema), which
+    // answers busy at once instead of waiting: try again, within the busy
+    // timeout, as a waiting lock would.
+    QElapsedTimer waited;
+    waited.start();
+    for (;;) {
+        try {
+            const SchemaOutcome done = prepareStore(*connection, path, wanted);
+            if (outcome)
+                *outcome = done;
+            return connection;
+        } catch (const StoreError& error) {
+            if (!isBusy(error) || waited.elapsed() >= options.busyTimeoutMs)
+                throw;
         }
+        QThread::msleep(5);
     }
-    const SchemaOutcome done = ensureSchema(*connection, wanted);
-    if (outcome)
-        *outcome = done;
-    return connection;
 }
 
 } // namespace ZelSql
