@@ -243,3 +243,33 @@ TEST(PostgresqlStore, LostConnectionIsUnavailableAndALostCommitHasAnUnknownOutco
         << unknown.what();
     EXPECT_EQ(0, count(*admin, QStringLiteral("SELECT count(*) FROM nodes")));
 }
+
+TEST(PostgresqlStore, PreparedStatementsAreKeptAcrossTransactionsAndFailures)
+{
+    SKIP_WITHOUT_POSTGRESQL();
+    StoreTest::ScratchDatabase scratch;
+    std::unique_ptr<Connection> store = openPostgresqlStore(scratch.url());
+    const QString insert = QStringLiteral("INSERT INTO users (name, password, full_name, admin) VALUES (?, ?, ?, ?)");
+    const QString select = QStringLiteral("SELECT full_name FROM users WHERE name = ?");
+
+    beginPostgresqlWrite(*store);
+    store->execPrepared(insert, {QStringLiteral("ann"), QStringLiteral("pw"), QStringLiteral("Ann Example"), false});
+    store->commit();
+    // The same statement fails inside a transaction, which aborts it ...
+    beginPostgresqlWrite(*store);
+    const StoreError twice = StoreTest::storeErrorOf(
+        [&] { store->execPrepared(insert, {QStringLiteral("ann"), QStringLiteral("pw"), QStringLiteral("Ann Again"), true}); });
+    EXPECT_EQ(StoreError::UniqueViolation, twice.kind()) << twice.what();
+    store->rollback();
+    // ... and still serves the next transaction, with new values.
+    beginPostgresqlWrite(*store);
+    store->execPrepared(insert, {QStringLiteral("bob"), QStringLiteral("pw"), QStringLiteral("Bob Example"), true});
+    store->commit();
+    for (const char* name : {"ann", "bob"}) {
+        QSqlQuery& query = store->execPrepared(select, {QString::fromLatin1(name)});
+        ASSERT_TRUE(query.next()) << name;
+        EXPECT_EQ(name[0] == 'a' ? "Ann Example" : "Bob Example", str(query.value(0).toString()));
+        query.finish();
+    }
+    EXPECT_EQ(2, count(*store, QStringLiteral("SELECT count(*) FROM users")));
+}

@@ -7,6 +7,10 @@
 // cannot be reached (StoreUnavailable), or it refused the login: a wrong
 // password, an unknown role, a missing database (LoginRefused).
 //
+// A connection lost (StoreUnavailable, OutcomeUnknown) is not reopened in
+// place: the server forgot its prepared statements, so the owner makes a new
+// Connection.
+//
 // Change transactions run SERIALIZABLE (beginPostgresqlWrite), so the
 // server's rules hold under concurrent sessions; the serialization failures
 // this causes are Conflict errors, for the caller to retry a bounded number

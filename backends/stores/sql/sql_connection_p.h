@@ -67,7 +67,9 @@ public:
 
     // Runs one statement with its values bound in order and returns the
     // query, positioned before its first row. A statement without values is
-    // run unprepared (DDL and transaction control cannot be prepared).
+    // run unprepared (DDL and transaction control cannot be prepared). With
+    // values it is prepared for this one run (on PostgreSQL a round trip of
+    // its own): statements run often go through execPrepared.
     QSqlQuery exec(const QString& sql, const QVariantList& values = QVariantList());
     // The same for a statement of the hot path: prepared once and kept for
     // the connection's life, bound and run again on each call. The answer is
