@@ -6,10 +6,14 @@ set -euo pipefail
 qt_major="${1:-5}"
 packages=(g++ cmake make pkg-config libboost-dev libgtest-dev libgmock-dev libbenchmark-dev valgrind locales
   abigail-tools)
+# The SQL stores: Qt SQL's SQLite and PostgreSQL drivers, libpq for
+# notifications, and the PostgreSQL server that the tests start privately
+# (scripts/pg-cluster.sh, binaries under /usr/lib/postgresql/*/bin).
+packages+=(libpq-dev postgresql)
 if [ "$qt_major" = 6 ]; then
-  packages+=(qt6-base-dev qt6-5compat-dev)
+  packages+=(qt6-base-dev qt6-5compat-dev libqt6sql6-sqlite libqt6sql6-psql)
 else
-  packages+=(qtbase5-dev)
+  packages+=(qtbase5-dev libqt5sql5-sqlite libqt5sql5-psql)
 fi
 
 sudo=""
