@@ -3,11 +3,17 @@
 # Usage: scripts/test.sh [--qt 6] [--sanitize address,undefined|thread] [--label LABEL] [--only REGEX]
 #   --qt 6        build against Qt 6 instead of Qt 5
 #   --sanitize S  build with the given sanitizers (-fsanitize=S)
-#   --label LABEL run only the tests carrying the ctest label (ctest -L), e.g. threads
+#   --label LABEL run only the tests whose ctest label matches LABEL (ctest -L), e.g.
+#                 threads, postgresql or 'threads|postgresql'
 #   --only REGEX  run only the tests whose names match REGEX (ctest -R)
 # Each variant builds in its own folder, build/<variant>.
+# The tests that need PostgreSQL run against a private cluster that this
+# script starts for the run and removes afterwards (scripts/with-postgresql.sh);
+# with ZEL_TEST_POSTGRESQL_URL already set they use that server instead, and
+# when no server can be started they are reported as skipped.
 set -euo pipefail
 cd "$(dirname "$0")/.."
+arguments=("$@")
 
 qt_major=5
 sanitize=""
@@ -24,6 +30,10 @@ while [ $# -gt 0 ]; do
 done
 
 scripts/deps.sh "$qt_major"
+
+if [ -z "${ZEL_TEST_POSTGRESQL_URL:-}" ] && [ -z "${ZEL_TEST_POSTGRESQL_TRIED:-}" ]; then
+  exec scripts/with-postgresql.sh env ZEL_TEST_POSTGRESQL_TRIED=1 "$0" "${arguments[@]}"
+fi
 
 variant="qt${qt_major}${sanitize:+-${sanitize//,/-}}"
 build="build/${variant}"
