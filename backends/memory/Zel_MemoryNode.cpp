@@ -1,6 +1,7 @@
 #include "Zel_MemoryNode.h"
 
 #include "memory_tree_p.h"
+#include "rules_p.h"
 #include "Zel_MemoryTree.h"
 
 #include "Zel_MimeTypeSpec.h"
@@ -126,12 +127,12 @@ Zel_PropertyList Zel_MemoryNode::cachedProperties()
     Zel_PropertyList fresh;
     bool found = false;
     if (boost::shared_ptr<Zel_MemoryTree> tree = mTree.lock()) {
-        ZelMemory::Tree& data = tree->data();
-        ZelMemory::ReadHold hold(data);
-        if (const ZelMemory::Node* node = data.byMoniker(mSnapshot.moniker)) {
-            fresh = ZelMemory::nodeProperties(data, *node);
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->data().beginRead();
+        if (const ZelMemory::Node* node = txn->nodeByMoniker(mSnapshot.moniker)) {
+            fresh = ZelMemory::nodeProperties(*node, txn->now());
             found = true;
         }
+        txn->commit();
     }
     std::lock_guard<std::mutex> lock(mCacheMutex);
     if (found) {

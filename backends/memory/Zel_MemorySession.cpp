@@ -3,6 +3,7 @@
 
 #include "memory_ops_p.h"
 #include "memory_session_p.h"
+#include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 #include "Zel_MemoryTree.h"
 
@@ -95,10 +96,10 @@ Zel_ResolutionIDList resolutionsOf(const boost::shared_ptr<Zel_MemoryTree>& tree
 {
     Zel_ResolutionIDList list;
     if (tree) {
-        ZelMemory::Tree& data = tree->data();
-        ZelMemory::ReadHold hold(data);
-        for (const ZelMemory::Resolution& r : data.resolutions)
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->data().beginRead();
+        for (const ZelMemory::Resolution& r : txn->resolutions())
             list.append(Zel_ResolutionID(r.label, r.id));
+        txn->commit();
     }
     return list;
 }
@@ -184,9 +185,8 @@ QString Zel_MemorySession::getServerVersion() const
 
 QString Zel_MemorySession::getWorkgroupName() const
 {
-    ZelMemory::Tree& data = mState->tree->data();
-    ZelMemory::ReadHold hold(data);
-    for (const auto& setting : data.workgroupSettings) {
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    for (const auto& setting : txn->workgroupSettings()) {
         if (setting.first == QLatin1String("Workgroup.Name"))
             return setting.second;
     }
@@ -245,9 +245,8 @@ bool Zel_MemorySession::isValidMoniker(const QString& moniker) const
 {
     if (moniker.startsWith(ZelMemory::MonikerScheme) && moniker.size() > ZelMemory::MonikerScheme.size())
         return true;
-    ZelMemory::Tree& data = mState->tree->data();
-    ZelMemory::ReadHold hold(data);
-    return data.byMoniker(moniker) != nullptr;
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    return txn->nodeByMoniker(moniker) != nullptr;
 }
 
 boost::shared_ptr<Orv_ResultQ> Zel_MemorySession::getResultQSP() const
@@ -286,12 +285,11 @@ QDateTime Zel_MemorySession::getServerTime() const
 bool Zel_MemorySession::isReadOnly() const
 {
     const QString user = mState->user();
-    ZelMemory::Tree& data = mState->tree->data();
-    ZelMemory::ReadHold hold(data);
-    const ZelMemory::Node* root = data.byId(data.rootId);
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    const ZelMemory::Node* root = txn->root();
     const std::uint32_t writing = ZelMemory::PermAddFiles | ZelMemory::PermAddFolders | ZelMemory::PermWriteAttributes
         | ZelMemory::PermDeleteAssets;
-    return user.isEmpty() || !root || (data.permissionsOf(user, *root) & writing) == 0;
+    return user.isEmpty() || !root || (ZelMemory::permissionsOf(*txn, user, *root) & writing) == 0;
 }
 
 int Zel_MemorySession::getMaxNameLength() const

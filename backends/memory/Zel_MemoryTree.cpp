@@ -120,17 +120,17 @@ QList<boost::shared_ptr<Zel_Node>> Zel_MemoryTree::childSnapshots(const boost::s
                                                                   const QString& parentMoniker, const QString& user)
 {
     QList<boost::shared_ptr<Zel_Node>> nodes;
-    const ZelMemory::Tree& data = *tree->d;
-    ZelMemory::ReadHold hold(data);
-    const ZelMemory::Node* parent = data.byMoniker(parentMoniker);
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->d->beginRead();
+    const ZelMemory::Node* parent = txn->nodeByMoniker(parentMoniker);
     if (!parent)
         return nodes;
-    const ZelMemory::SnapshotContext context = ZelMemory::childContext(data, parent, user);
-    nodes.reserve(parent->children.size());
-    for (const QString& id : parent->children) {
-        if (const ZelMemory::Node* child = data.byId(id))
-            nodes.append(ZelMemory::snapshotOf(data, *child, user, context, tree));
-    }
+    const ZelMemory::SnapshotContext context = ZelMemory::childContext(*txn, parent, user);
+    std::vector<const ZelMemory::Node*> children;
+    txn->children(*parent, children);
+    nodes.reserve(static_cast<int>(children.size()));
+    for (const ZelMemory::Node* child : children)
+        nodes.append(ZelMemory::snapshotOf(*txn, *child, context, tree));
+    txn->commit();
     return nodes;
 }
 
