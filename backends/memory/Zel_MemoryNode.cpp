@@ -129,7 +129,7 @@ Zel_PropertyList Zel_MemoryNode::cachedProperties()
     if (boost::shared_ptr<Zel_MemoryTree> tree = mTree.lock()) {
         const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->data().beginRead();
         if (const ZelMemory::Node* node = txn->nodeByMoniker(mSnapshot.moniker)) {
-            fresh = ZelMemory::nodeProperties(*node, txn->now());
+            fresh = ZelMemory::nodeProperties(*txn, *node);
             found = true;
         }
         txn->commit();

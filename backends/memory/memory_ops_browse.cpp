@@ -369,14 +369,14 @@ ZEL_MEMORY_EXECUTE(QueryOp)
 
 void PropertyListOp::run(Work& work, const Args& args, Result& result)
 {
-    result.succeed(nodeProperties(work.node(args.moniker), work.txn.now()));
+    result.succeed(nodeProperties(work.txn, work.node(args.moniker)));
 }
 ZEL_MEMORY_EXECUTE(PropertyListOp)
 
 void GetPropertiesOp::run(Work& work, const Args& args, Result& result)
 {
     const Node& node = work.node(args.moniker);
-    const Zel_PropertyList all = nodeProperties(node, work.txn.now());
+    const Zel_PropertyList all = nodeProperties(work.txn, node);
     if (args.keys.isEmpty()) {
         result.succeed(all);
         return;
@@ -451,7 +451,7 @@ void GetReservationsOp::run(Work& work, const Args& args, Result& result)
     const Node& node = work.node(args.moniker);
     // The holder and the end of the node's reservation; no answer when free
     // (never reserved, released, or expired).
-    if (node.reservation.isActiveAt(work.txn.now()))
+    if (isReserved(work.txn, node.reservation))
         result.setResult(node.reservation.user, node.reservation.until, ok());
 }
 ZEL_MEMORY_EXECUTE(GetReservationsOp)

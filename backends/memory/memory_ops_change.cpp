@@ -582,7 +582,7 @@ ZEL_MEMORY_EXECUTE(CreateReservationOp)
 void RemoveReservationOp::run(WriteWork& work, const Args& args, Result& result)
 {
     const Node& node = work.node(args.moniker);
-    if (!node.reservation.isActiveAt(work.txn.now()))
+    if (!isReserved(work.txn, node.reservation))
         fail(Zel_MemoryErrorCodes::NotReserved, QStringLiteral("%1 is not reserved.").arg(work.describe(node)));
     if (node.reservation.user != work.user
         && !(work.permissions(node) & PermOverrideReservation))

@@ -431,7 +431,7 @@ boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& n, const Snapsh
     s.name = n.name;
     s.mimeType = n.mimeType;
     s.mobID = n.mobId;
-    if (n.reservation.isActiveAt(txn.now())) { // an expired reservation holds nothing
+    if (isReserved(txn, n.reservation)) { // an expired reservation holds nothing
         s.reservedBy = n.reservation.user;
         s.reservedSince = n.reservation.since;
         s.reservedUntil = n.reservation.until;
@@ -440,7 +440,7 @@ boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& n, const Snapsh
     s.userPlaced = n.userPlaced;
     s.dropTarget = Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(n.mimeType)
         && (permissionsBelow(context.account, n, context.permissions) & (PermAddFiles | PermAddFolders)) != 0;
-    s.properties = nodeProperties(n, txn.now());
+    s.properties = nodeProperties(txn, n);
     return boost::make_shared<Zel_MemoryNode>(std::move(s), owner);
 }
 

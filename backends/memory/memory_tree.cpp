@@ -237,8 +237,8 @@ template <class Base, class Lock>
 class MemoryTxn : public Base
 {
 public:
-    MemoryTxn(Tree& tree, const QDateTime& now)
-        : Base(now)
+    explicit MemoryTxn(Tree& tree)
+        : Base(tree)
         , mTree(tree)
         , mLock(tree.mutex)
     {
@@ -392,12 +392,12 @@ private:
 
 std::unique_ptr<ReadTxn> Tree::beginRead()
 {
-    return std::unique_ptr<ReadTxn>(new MemoryReadTxn(*this, now()));
+    return std::unique_ptr<ReadTxn>(new MemoryReadTxn(*this));
 }
 
 std::unique_ptr<WriteTxn> Tree::beginWrite()
 {
-    return std::unique_ptr<WriteTxn>(new MemoryWriteTxn(*this, now()));
+    return std::unique_ptr<WriteTxn>(new MemoryWriteTxn(*this));
 }
 
 } // namespace ZelMemory

@@ -78,10 +78,10 @@ const char* userSettingsTypeName(int type)
     }
 }
 
-Zel_PropertyList nodeProperties(const Node& node, const QDateTime& now)
+Zel_PropertyList nodeProperties(ReadTxn& txn, const Node& node)
 {
     Zel_PropertyList list;
-    const bool locked = node.reservation.isActiveAt(now);
+    const bool locked = isReserved(txn, node.reservation);
     list.reserve(2 + (node.mobId.isEmpty() ? 0 : 1) + node.properties.size() + (locked ? 2 : 0));
     list.append(Zel_Property(QStringLiteral("Name"), node.name, QString()));
     list.append(Zel_Property(QStringLiteral("Mime Type"), node.mimeType, QString()));
@@ -174,8 +174,7 @@ bool isSyncedProject(const Node& node)
 
 const Node* reservedByOther(ReadTxn& txn, const Node& node, const QString& userName, bool below)
 {
-    const QDateTime& now = txn.now();
-    if (node.reservation.isActiveAt(now) && node.reservation.user != userName)
+    if (isReserved(txn, node.reservation) && node.reservation.user != userName)
         return &node;
     if (!below)
         return nullptr;
@@ -191,7 +190,7 @@ const Node* reservedByOther(ReadTxn& txn, const Node& node, const QString& userN
     while (!pending.empty()) {
         const Node* n = pending.back();
         pending.pop_back();
-        if (n->reservation.isActiveAt(now) && n->reservation.user != userName)
+        if (isReserved(txn, n->reservation) && n->reservation.user != userName)
             return n;
         pushChildren(*n);
     }

@@ -50,9 +50,16 @@ std::vector<const Node*> subtreeOf(ReadTxn& txn, const Node& node);
 // A fresh media object ID.
 QString newMobId();
 
+// True when the reservation is held and not expired at the transaction's
+// time (the clock is read only for a held one).
+inline bool isReserved(ReadTxn& txn, const Reservation& reservation)
+{
+    return !reservation.user.isEmpty() && reservation.isActiveAt(txn.now());
+}
+
 // The properties a node shows: Name, Mime Type, MobID (media only), the
-// stored properties, and Locked By / Locked On while it is reserved at now.
-Zel_PropertyList nodeProperties(const Node& node, const QDateTime& now);
+// stored properties, and Locked By / Locked On while it is reserved.
+Zel_PropertyList nodeProperties(ReadTxn& txn, const Node& node);
 
 // One node (and its subtree) in the form of the tree file (memory_json.cpp).
 QByteArray nodeJson(ReadTxn& txn, const Node& node);

@@ -8,9 +8,18 @@ namespace ZelMemory {
 
 Observer::~Observer() = default;
 
-ReadTxn::ReadTxn(const QDateTime& now)
-    : mNow(now)
+ReadTxn::ReadTxn(const Store& store)
+    : mStore(store)
 {
+}
+
+const QDateTime& ReadTxn::now() const
+{
+    if (!mHasNow) {
+        mNow = mStore.now();
+        mHasNow = true;
+    }
+    return mNow;
 }
 
 ReadTxn::~ReadTxn() = default;
@@ -35,8 +44,8 @@ void ReadTxn::commit()
     publishCommitted();
 }
 
-WriteTxn::WriteTxn(const QDateTime& now)
-    : ReadTxn(now)
+WriteTxn::WriteTxn(const Store& store)
+    : ReadTxn(store)
 {
 }
 

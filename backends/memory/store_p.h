@@ -26,8 +26,9 @@
 //   effects (login state, property-key registration, callback setters) are
 //   registered with onCommit() and run once the data is committed, before
 //   the change reports are handed out.
-// - now() is the transaction's clock, read once when it begins from the
-//   store's clock (settable, for tests of reservation expiry).
+// - now() is the transaction's clock: the store's clock (settable, for tests
+//   of reservation expiry), read when the transaction first asks and then
+//   the same for its whole work.
 #ifndef ZEL_MEMORY_STORE_P_H
 #define ZEL_MEMORY_STORE_P_H
 
@@ -53,6 +54,8 @@
 class Zel_MemoryPropertyManager;
 
 namespace ZelMemory {
+
+class Store;
 
 // The server's limits (Zel_MemoryLimits.h), by their short names.
 using Zel_MemoryLimits::MaxDepth;
@@ -228,7 +231,7 @@ public:
     virtual ~ReadTxn();
 
     // The transaction's clock.
-    const QDateTime& now() const { return mNow; }
+    const QDateTime& now() const;
 
     // --- Nodes. ---
     virtual const Node* root() = 0;
@@ -268,7 +271,7 @@ public:
     bool isCommitted() const { return mCommitted; }
 
 protected:
-    explicit ReadTxn(const QDateTime& now);
+    explicit ReadTxn(const Store& store);
     // The store's commit; throws on failure (the transaction then rolls back).
     virtual void commitData() = 0;
     // After the effects: a write transaction hands out its change reports.
@@ -278,7 +281,9 @@ private:
     ReadTxn(const ReadTxn&) = delete;
     ReadTxn& operator=(const ReadTxn&) = delete;
 
-    QDateTime mNow;
+    const Store& mStore;
+    mutable QDateTime mNow; // read from the store's clock on first use
+    mutable bool mHasNow = false;
     std::vector<std::function<void()>> mEffects;
     bool mCommitted = false;
 };
@@ -311,7 +316,7 @@ public:
     void reportUpdated(const QString& parentMoniker, const QString& childMoniker);
 
 protected:
-    explicit WriteTxn(const QDateTime& now);
+    explicit WriteTxn(const Store& store);
     std::vector<Change> mChanges;
 };
 
