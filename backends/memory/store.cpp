@@ -68,13 +68,6 @@ Store::Store() = default;
 
 Store::~Store() = default;
 
-void Store::setClock(Clock clock)
-{
-    std::lock_guard<std::mutex> lock(mClockMutex);
-    mClock = std::move(clock);
-    mClockSet.store(static_cast<bool>(mClock));
-}
-
 QDateTime Store::now() const
 {
     if (mClockSet.load(std::memory_order_relaxed)) {

@@ -49,6 +49,7 @@
 #include <functional>
 #include <memory>
 #include <mutex>
+#include <utility>
 #include <vector>
 
 class Zel_MemoryPropertyManager;
@@ -338,7 +339,12 @@ public:
 
     // The clock of new transactions: QDateTime::currentDateTimeUtc() unless
     // set (tests).
-    void setClock(Clock clock);
+    void setClock(Clock clock)
+    {
+        std::lock_guard<std::mutex> lock(mClockMutex);
+        mClock = std::move(clock);
+        mClockSet.store(static_cast<bool>(mClock));
+    }
     QDateTime now() const;
 
     // The property manager that answers for this store's keys (shared with
