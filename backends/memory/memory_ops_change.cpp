@@ -370,8 +370,9 @@ void DeleteOp::run(WriteWork& work, const Args& args, Result& result)
     long assets = 0;
     long records = 0;
     // Each asset on its own: one that cannot be deleted is reported and left
-    // as it is, the others go.
+    // as it is (its savepoint rolled back to), the others go.
     for (const QString& moniker : args.monikers) {
+        const WriteTxn::Savepoint point = work.write.savepoint();
         try {
             const Node& node = work.node(sharedText(moniker));
             const Node& parent = parentOrFail(work, node, QStringLiteral("deleted"));
@@ -410,6 +411,7 @@ void DeleteOp::run(WriteWork& work, const Args& args, Result& result)
             work.write.reportRemoved(parentMoniker, nodeMoniker);
             ++assets;
         } catch (const Failure& failure) {
+            work.write.rollbackTo(point);
             result.setErrorResult(failure.error);
         }
     }

@@ -165,6 +165,7 @@ void CheckinUpdateOp::run(WriteWork& work, const Args& args, Result& result)
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media objects to update were given."));
     for (unsigned long long i = 0; i < args.mobs.size(); ++i) {
         boost::shared_ptr<Zel_MobDesc> desc = args.mobs.getMobDesc(i);
+        const WriteTxn::Savepoint point = work.write.savepoint();
         try {
             if (!desc)
                 fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("Media object %1 is empty.").arg(i + 1));
@@ -193,6 +194,7 @@ void CheckinUpdateOp::run(WriteWork& work, const Args& args, Result& result)
             reportUpdated(work, node);
             result.addItem(ok());
         } catch (const Failure& failure) {
+            work.write.rollbackTo(point);
             result.addItem(failure.error);
         }
     }

@@ -1,7 +1,10 @@
 // The in-memory store: its tables, and its transactions over them.
 #include "memory_tree_p.h"
 
+#include <QSet>
+
 #include <algorithm>
+#include <memory>
 #include <utility>
 
 namespace ZelMemory {
@@ -108,44 +111,69 @@ StoredNode& Tree::addNode(StoredNode node)
 
 int Tree::removeSubtree(const QString& id)
 {
+    return static_cast<int>(takeSubtree(id).records.size());
+}
+
+Tree::Taken Tree::takeSubtree(const QString& id)
+{
+    Taken taken;
     StoredNode* top = byId(id);
     if (!top)
-        return 0;
+        return taken;
     // Only the top leaves its parent's lists; the records below go with it.
-    detach(*top);
+    taken.parentId = top->parentId;
+    taken.index = detach(*top);
     QStringList subtree{id};
     for (int i = 0; i < subtree.size(); ++i) {
         if (const StoredNode* node = byId(subtree.at(i)))
             subtree.append(node->children);
     }
-    // Deepest first, as children before their parents.
-    int removed = 0;
-    for (int i = subtree.size() - 1; i >= 0; --i) {
-        auto it = nodes.find(subtree.at(i));
+    taken.records.reserve(static_cast<std::size_t>(subtree.size()));
+    for (const QString& recordId : subtree) {
+        auto it = nodes.find(recordId);
         if (it == nodes.end())
             continue;
         idByGivenMoniker.remove(it->second.moniker);
+        taken.records.push_back(std::move(it->second));
         nodes.erase(it);
-        ++removed;
     }
-    return removed;
+    return taken;
 }
 
-void Tree::detach(StoredNode& node)
+void Tree::restoreSubtree(Taken taken)
 {
+    if (taken.records.empty())
+        return;
+    const QString topId = taken.records.front().id;
+    for (StoredNode& record : taken.records)
+        addNode(std::move(record));
+    StoredNode* top = byId(topId);
+    if (StoredNode* parent = byId(taken.parentId))
+        attach(*top, *parent, taken.index);
+}
+
+int Tree::detach(StoredNode& node)
+{
+    int index = -1;
     if (StoredNode* parent = byId(node.parentId)) {
-        parent->children.removeOne(node.id);
+        index = parent->children.indexOf(node.id);
+        if (index >= 0)
+            parent->children.removeAt(index);
         auto it = parent->childByName.find(node.name);
         if (it != parent->childByName.end() && it.value() == node.id)
             parent->childByName.erase(it);
     }
     node.parentId.clear();
+    return index;
 }
 
-void Tree::attach(StoredNode& node, StoredNode& parent)
+void Tree::attach(StoredNode& node, StoredNode& parent, int index)
 {
     node.parentId = parent.id;
-    parent.children.append(node.id);
+    if (index < 0 || index > parent.children.size())
+        parent.children.append(node.id);
+    else
+        parent.children.insert(index, node.id);
     parent.childByName.insert(node.name, node.id);
 }
 
@@ -318,8 +346,10 @@ protected:
     void commitData() override { mLock.unlock(); }
 };
 
-// Changes are made in place: the rules validate before they change the
-// first record, so a rollback only drops the change reports and effects.
+// Changes are made in place, each with its undo step in a log: a rollback
+// (to a savepoint, or of the whole transaction when it ends without commit)
+// runs the steps back, newest first. An edited record's former state is kept
+// once per transaction (until a rollback undoes that edit).
 class MemoryWriteTxn final : public MemoryTxn<WriteTxn, std::unique_lock<std::shared_mutex>>
 {
 public:
@@ -327,6 +357,8 @@ public:
 
     ~MemoryWriteTxn() override
     {
+        if (!isCommitted())
+            undoTo(0);
         // A ticket taken is published exactly once, or every later batch
         // would wait for it for ever.
         if (mHasTicket && !mPublished) {
@@ -337,33 +369,105 @@ public:
         }
     }
 
-    Node& edit(const Node& node) override { return mutableStored(node); }
+    Node& edit(const Node& node) override
+    {
+        StoredNode& record = mutableStored(node);
+        if (!mEdited.contains(record.id)) {
+            mEdited.insert(record.id);
+            const QString id = record.id;
+            const Node before = record;
+            mUndo.push_back([this, id, before] {
+                if (StoredNode* current = mTree.byId(id))
+                    static_cast<Node&>(*current) = before;
+                mEdited.remove(id);
+            });
+        }
+        return record;
+    }
     const Node& insertNode(Node node, const Node& parent) override
     {
+        const std::uint64_t serialBefore = mTree.serial;
         StoredNode record;
         static_cast<Node&>(record) = std::move(node);
         record.id = mTree.newNodeId();
         record.moniker = monikerOfId(record.id);
-        return mTree.insertNode(std::move(record), mutableStored(parent));
+        StoredNode& inserted = mTree.insertNode(std::move(record), mutableStored(parent));
+        const QString id = inserted.id;
+        mUndo.push_back([this, id, serialBefore] {
+            mTree.removeSubtree(id);
+            mTree.serial = serialBefore;
+        });
+        return inserted;
     }
-    void renameNode(const Node& node, const QString& name) override { mTree.rename(mutableStored(node), name); }
+    void renameNode(const Node& node, const QString& name) override
+    {
+        StoredNode& record = mutableStored(node);
+        const QString id = record.id;
+        const QString before = record.name;
+        mTree.rename(record, name);
+        mUndo.push_back([this, id, before] {
+            if (StoredNode* current = mTree.byId(id))
+                mTree.rename(*current, before);
+        });
+    }
     void moveNode(const Node& node, const Node& parent) override
     {
         StoredNode& record = mutableStored(node);
-        mTree.detach(record);
+        const QString id = record.id;
+        const QString parentBefore = record.parentId;
+        const int index = mTree.detach(record);
         mTree.attach(record, mutableStored(parent));
+        mUndo.push_back([this, id, parentBefore, index] {
+            StoredNode* current = mTree.byId(id);
+            StoredNode* oldParent = mTree.byId(parentBefore);
+            if (!current || !oldParent)
+                return;
+            mTree.detach(*current);
+            mTree.attach(*current, *oldParent, index);
+        });
     }
-    int removeSubtree(const Node& node) override { return mTree.removeSubtree(node.id); }
-    void insertKey(const KeyDesc& key) override { mTree.keys.append(key); }
+    int removeSubtree(const Node& node) override
+    {
+        auto taken = std::make_shared<Tree::Taken>(mTree.takeSubtree(node.id));
+        const int count = static_cast<int>(taken->records.size());
+        mUndo.push_back([this, taken] { mTree.restoreSubtree(std::move(*taken)); });
+        return count;
+    }
+    void insertKey(const KeyDesc& key) override
+    {
+        mTree.keys.append(key);
+        mUndo.push_back([this] { mTree.keys.removeLast(); });
+    }
     void setApplicationSettings(const QString& application, const SettingPairs& settings) override
     {
-        mTree.applicationSettings.insert(application, settings);
+        auto& table = mTree.applicationSettings;
+        keepEntry(table, application);
+        table.insert(application, settings);
     }
     void setUserSettings(const QString& user, int type, const SettingPairs& settings) override
     {
-        mTree.userSettings[user].insert(type, settings);
+        const bool hadUser = mTree.userSettings.contains(user);
+        auto& types = mTree.userSettings[user];
+        const bool hadType = types.contains(type);
+        const SettingPairs before = types.value(type);
+        types.insert(type, settings);
+        mUndo.push_back([this, user, type, hadUser, hadType, before] {
+            if (!hadUser) {
+                mTree.userSettings.remove(user);
+                return;
+            }
+            auto& current = mTree.userSettings[user];
+            if (hadType)
+                current.insert(type, before);
+            else
+                current.remove(type);
+        });
     }
-    void setDocument(const QString& name, const QString& xml) override { mTree.documents.insert(name, xml); }
+    void setDocument(const QString& name, const QString& xml) override
+    {
+        keepEntry(mTree.documents, name);
+        mTree.documents.insert(name, xml);
+    }
 
 protected:
     void commitData() override
@@ -372,6 +476,7 @@ protected:
             mTicket = mTree.takeTicket();
             mHasTicket = true;
         }
+        mUndo.clear();
         mLock.unlock();
     }
     void publishCommitted() override
@@ -381,8 +486,36 @@ protected:
         mPublished = true;
         mTree.publish(mTicket, mChanges);
     }
+    int setSavepoint() override { return static_cast<int>(mUndo.size()); }
+    void rollbackToSavepoint(int mark) override { undoTo(static_cast<std::size_t>(mark)); }
 
 private:
+    // Runs the undo steps after the first count, newest first.
+    void undoTo(std::size_t count) noexcept
+    {
+        while (mUndo.size() > count) {
+            const std::function<void()> step = std::move(mUndo.back());
+            mUndo.pop_back();
+            step();
+        }
+    }
+    // Logs how to put back the entry key of table (or take it out again).
+    template <class Table>
+    void keepEntry(Table& table, const QString& key)
+    {
+        auto it = table.constFind(key);
+        const bool had = it != table.constEnd();
+        const typename Table::mapped_type before = had ? it.value() : typename Table::mapped_type();
+        mUndo.push_back([&table, key, had, before] {
+            if (had)
+                table.insert(key, before);
+            else
+                table.remove(key);
+        });
+    }
+
+    std::vector<std::function<void()>> mUndo;
+    QSet<QString> mEdited;
     std::uint64_t mTicket = 0;
     bool mHasTicket = false;
     bool mPublished = false;

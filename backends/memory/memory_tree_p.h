@@ -121,10 +121,22 @@ public:
     StoredNode& addNode(StoredNode node);
     // Removes node and its subtree; answers the number of records removed.
     int removeSubtree(const QString& id);
-    // Takes node out of its parent's children (it keeps its subtree).
-    void detach(StoredNode& node);
-    // Puts a detached node at the end of parent's children.
-    void attach(StoredNode& node, StoredNode& parent);
+    // A subtree taken out of the tables: its records, the top first, and
+    // where the top was among its parent's children.
+    struct Taken {
+        QString parentId;
+        int index = -1;
+        std::vector<StoredNode> records;
+    };
+    Taken takeSubtree(const QString& id);
+    // Puts a taken subtree back where it was.
+    void restoreSubtree(Taken taken);
+    // Takes node out of its parent's children (it keeps its subtree);
+    // answers where it was among them (-1: nowhere).
+    int detach(StoredNode& node);
+    // Puts a detached node among parent's children at index (at the end for
+    // -1).
+    void attach(StoredNode& node, StoredNode& parent, int index = -1);
     // Renames node, keeping its parent's index of names current.
     void rename(StoredNode& node, const QString& name);
 

@@ -18,9 +18,13 @@
 //   An edited record's id, moniker, parentId and name are changed only
 //   through insertNode, renameNode, moveNode and removeSubtree, which keep the
 //   store's indexes (children in order, child by name) and constraints.
-// - The rules validate a request completely before they change the first
-//   record, so that a failing request changes nothing in a store that works
-//   in place (the memory store); a store with real transactions rolls back.
+// - A transaction destroyed without commit() undoes every change it made
+//   (the memory store keeps an undo log; a database rolls back). The rules
+//   still validate a request completely before they change the first record,
+//   so that an expected failure costs no undoing.
+// - Per-item partial success (deleting several assets, updating several
+//   media objects) takes a savepoint before each item and rolls back to it
+//   when the item fails; the item's change reports and effects go with it.
 // - Side effects happen only after commit: change reports (reportAdded, ...)
 //   are published by the store to every observer in commit order; other
 //   effects (login state, property-key registration, callback setters) are
@@ -44,6 +48,7 @@
 
 #include <boost/shared_ptr.hpp>
 
+#include <algorithm>
 #include <atomic>
 #include <cstdint>
 #include <functional>
@@ -221,7 +226,7 @@ struct Change {
 class Observer
 {
 public:
-    virtual ~Observer();
+    virtual ~Observer() = default;
     virtual void treeChanged(const std::vector<Change>& changes) = 0;
 };
 
@@ -229,10 +234,10 @@ public:
 class ReadTxn
 {
 public:
-    virtual ~ReadTxn();
+    virtual ~ReadTxn() = default;
 
     // The transaction's clock.
-    const QDateTime& now() const;
+    inline const QDateTime& now() const;
 
     // --- Nodes. ---
     virtual const Node* root() = 0;
@@ -263,18 +268,23 @@ public:
 
     // --- Ending. ---
     // Runs effect once the transaction has committed (never after a rollback).
-    void onCommit(std::function<void()> effect);
+    void onCommit(std::function<void()> effect) { mEffects.push_back(std::move(effect)); }
     // Commits: the store makes the work durable (or, for reading, ends it),
     // then the registered effects run in order, then the change reports go
     // out. A transaction is committed at most once; a failure to commit
     // throws and leaves it rolled back.
-    void commit();
+    inline void commit();
     bool isCommitted() const { return mCommitted; }
 
 protected:
-    explicit ReadTxn(const Store& store);
+    explicit ReadTxn(const Store& store)
+        : mStore(store)
+    {
+    }
     // The store's commit; throws on failure (the transaction then rolls back).
     virtual void commitData() = 0;
+    std::size_t effectCount() const { return mEffects.size(); }
+    void dropEffectsFrom(std::size_t count) { mEffects.resize(std::min(count, mEffects.size())); }
     // After the effects: a write transaction hands out its change reports.
     virtual void publishCommitted() {}
 
@@ -312,12 +322,45 @@ public:
 
     // Change reports, published to the store's observers after commit, in
     // commit order; dropped on rollback.
-    void reportAdded(const QString& parentMoniker, const QString& childMoniker);
-    void reportRemoved(const QString& parentMoniker, const QString& childMoniker);
-    void reportUpdated(const QString& parentMoniker, const QString& childMoniker);
+    void reportAdded(const QString& parentMoniker, const QString& childMoniker)
+    {
+        mChanges.push_back(Change{Change::Added, parentMoniker, childMoniker});
+    }
+    void reportRemoved(const QString& parentMoniker, const QString& childMoniker)
+    {
+        mChanges.push_back(Change{Change::Removed, parentMoniker, childMoniker});
+    }
+    void reportUpdated(const QString& parentMoniker, const QString& childMoniker)
+    {
+        mChanges.push_back(Change{Change::Updated, parentMoniker, childMoniker});
+    }
+
+    // A point to roll back to without ending the transaction.
+    struct Savepoint {
+        int store;            // the store's own mark (setSavepoint)
+        std::size_t changes;  // change reports before it
+        std::size_t effects;  // effects before it
+    };
+    Savepoint savepoint() { return Savepoint{setSavepoint(), mChanges.size(), effectCount()}; }
+    // Undoes every change, report and effect made since the savepoint; the
+    // savepoint stays usable.
+    void rollbackTo(const Savepoint& point)
+    {
+        rollbackToSavepoint(point.store);
+        if (mChanges.size() > point.changes)
+            mChanges.erase(mChanges.begin() + static_cast<std::ptrdiff_t>(point.changes), mChanges.end());
+        dropEffectsFrom(point.effects);
+    }
 
 protected:
-    explicit WriteTxn(const Store& store);
+    explicit WriteTxn(const Store& store)
+        : ReadTxn(store)
+    {
+    }
+    // The store's part of savepoint() and rollbackTo().
+    virtual int setSavepoint() = 0;
+    virtual void rollbackToSavepoint(int mark) = 0;
+
     std::vector<Change> mChanges;
 };
 
@@ -328,8 +371,8 @@ class Store
 public:
     typedef std::function<QDateTime()> Clock;
 
-    Store();
-    virtual ~Store();
+    Store() = default;
+    virtual ~Store() = default;
 
     virtual std::unique_ptr<ReadTxn> beginRead() = 0;
     virtual std::unique_ptr<WriteTxn> beginWrite() = 0;
@@ -345,7 +388,15 @@ public:
         mClock = std::move(clock);
         mClockSet.store(static_cast<bool>(mClock));
     }
-    QDateTime now() const;
+    QDateTime now() const
+    {
+        if (mClockSet.load(std::memory_order_relaxed)) {
+            std::lock_guard<std::mutex> lock(mClockMutex);
+            if (mClock)
+                return mClock();
+        }
+        return QDateTime::currentDateTimeUtc();
+    }
 
     // The property manager that answers for this store's keys (shared with
     // the sessions that register it).
@@ -356,6 +407,32 @@ private:
     Clock mClock;
     std::atomic<bool> mClockSet{false}; // read without the lock on every transaction
 };
+
+// --- Inline parts that need Store complete ---------------------------------
+
+const QDateTime& ReadTxn::now() const
+{
+    if (!mHasNow) {
+        mNow = mStore.now();
+        mHasNow = true;
+    }
+    return mNow;
+}
+
+void ReadTxn::commit()
+{
+    if (mCommitted)
+        return;
+    commitData();
+    mCommitted = true;
+    // The effects, then the change reports: an application that hears of a
+    // change finds its effects (a registered property key, ...) in place.
+    const std::vector<std::function<void()>> effects = std::move(mEffects);
+    mEffects.clear();
+    for (const std::function<void()>& effect : effects)
+        effect();
+    publishCommitted();
+}
 
 } // namespace ZelMemory
 
