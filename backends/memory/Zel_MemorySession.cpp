@@ -146,6 +146,8 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     , mState(new ZelMemory::SessionState)
 {
     mState->tree = tree ? tree : Zel_MemoryTree::sample();
+    // The store is the tree's records, kept alive by the tree.
+    mState->storeRef = boost::shared_ptr<ZelMemory::Store>(mState->tree, &mState->tree->data());
     if (engine) {
         mState->engine = engine->getHandle();
         mState->resultQ = engine->getResultQ();
@@ -158,8 +160,8 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     setRemoteClientStatus(false);
 
     mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ, mState));
-    mState->tree->data().addObserver(mObserver);
-    mPropertyManager = mState->tree->data().propertyManager;
+    mState->store().addObserver(mObserver);
+    mPropertyManager = mState->store().propertyManager;
     registerManager(mPropertyManager);
 }
 
@@ -167,7 +169,7 @@ Zel_MemorySession::~Zel_MemorySession()
 {
     // Requests that outlive the session fail with NotConnected from now on.
     mState->closed = true;
-    mState->tree->data().removeObserver(mObserver.get());
+    mState->store().removeObserver(mObserver.get());
     unregisterManager(mPropertyManager);
 }
 

@@ -120,7 +120,8 @@ QList<boost::shared_ptr<Zel_Node>> Zel_MemoryTree::childSnapshots(const boost::s
                                                                   const QString& parentMoniker, const QString& user)
 {
     QList<boost::shared_ptr<Zel_Node>> nodes;
-    const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->d->beginRead();
+    const boost::shared_ptr<ZelMemory::Store> owner(tree, tree->d.get());
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = owner->beginRead();
     const ZelMemory::Node* parent = txn->nodeByMoniker(parentMoniker);
     if (!parent)
         return nodes;
@@ -129,7 +130,7 @@ QList<boost::shared_ptr<Zel_Node>> Zel_MemoryTree::childSnapshots(const boost::s
     txn->children(*parent, children);
     nodes.reserve(static_cast<int>(children.size()));
     for (const ZelMemory::Node* child : children)
-        nodes.append(ZelMemory::snapshotOf(*txn, *child, context, tree));
+        nodes.append(ZelMemory::snapshotOf(*txn, *child, context, owner));
     txn->commit();
     return nodes;
 }

@@ -1,5 +1,4 @@
 #include "memory_session_p.h"
-#include "memory_tree_p.h"
 
 #include "Zel_MemoryNode.h"
 
@@ -143,11 +142,6 @@ void SessionObserver::treeChanged(const std::vector<Change>& changes)
 }
 
 // --- SessionState -------------------------------------------------------------
-
-Store& SessionState::store() const
-{
-    return tree->data();
-}
 
 QString SessionState::user() const
 {
@@ -387,12 +381,12 @@ void Work::requireFreeName(const Node& parent, const QString& name, const Node* 
 
 boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n)
 {
-    return snapshotOf(txn, n, user, session.tree);
+    return snapshotOf(txn, n, user, session.storeRef);
 }
 
 boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n, const SnapshotContext& context)
 {
-    return snapshotOf(txn, n, context, session.tree);
+    return snapshotOf(txn, n, context, session.storeRef);
 }
 
 SnapshotContext childContext(ReadTxn& txn, const Node* parent, const QString& user)
@@ -410,13 +404,13 @@ SnapshotContext childContext(ReadTxn& txn, const Node* parent, const QString& us
 }
 
 boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& n, const QString& user,
-                                       const boost::shared_ptr<Zel_MemoryTree>& owner)
+                                       const boost::shared_ptr<Store>& owner)
 {
     return snapshotOf(txn, n, childContext(txn, parentOf(txn, n), user), owner);
 }
 
 boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& n, const SnapshotContext& context,
-                                       const boost::shared_ptr<Zel_MemoryTree>& owner)
+                                       const boost::shared_ptr<Store>& owner)
 {
     Zel_MemoryNode::Snapshot s;
     s.moniker = n.moniker;

@@ -21,7 +21,6 @@
 #include "rules_p.h"
 #include "Zel_MemoryError.h"
 #include "Zel_MemoryErrorCodes.h"
-#include "Zel_MemoryTree.h"
 
 #include "Zel_Req.h"
 #include "Orv_Request.h"
@@ -42,6 +41,7 @@
 #include <vector>
 
 class Orv_EngineHandle;
+class Zel_MemoryTree;
 class Zel_EventCB;
 class Zel_Node;
 class Zel_NodeListener;
@@ -99,9 +99,10 @@ private:
 class SessionState
 {
 public:
-    boost::shared_ptr<Zel_MemoryTree> tree;
-    // The store of the session's records (the tree's).
-    Store& store() const;
+    boost::shared_ptr<Zel_MemoryTree> tree; // the session's tree, for the session's own accessors
+    // The store of the session's records; the rules reach them only through it.
+    boost::shared_ptr<Store> storeRef;
+    Store& store() const { return *storeRef; }
     boost::shared_ptr<Orv_EngineHandle> engine; // refuses requests once the engine is gone
     boost::shared_ptr<Orv_ResultQ> resultQ;
     QString applicationName;
@@ -235,13 +236,13 @@ struct ReleasesInOrder : std::false_type {
 };
 
 // The snapshot of node that the requests of user answer with (owner: the
-// tree the snapshot reads its properties from afresh); context is that of
+// store the snapshot reads its properties from afresh); context is that of
 // node's parent.
 boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& node, const SnapshotContext& context,
-                                       const boost::shared_ptr<Zel_MemoryTree>& owner);
+                                       const boost::shared_ptr<Store>& owner);
 // The same, working the context out.
 boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& node, const QString& user,
-                                       const boost::shared_ptr<Zel_MemoryTree>& owner);
+                                       const boost::shared_ptr<Store>& owner);
 
 // A final result of the operation's result class holding only the failure.
 template <class Op>
