@@ -1,6 +1,6 @@
 // Operations on media objects: analysis, check-in, check-in update, and the
 // lookups by MobID (node, binary form, head frame).
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_AnalyzeCB.h"
 #include "Zel_CheckinRes.h"

@@ -1,6 +1,6 @@
 // Operations that read the tree: nodes, children, paths, properties,
 // permissions, reservations, frame locators and restrictions, search.
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_AssociationsRes.h"
 #include "Zel_ChildrenAtCB.h"

@@ -1,7 +1,7 @@
 // Operations of the session: login, start-up, and the settings the server
 // stores for users, applications and the workgroup, exchanged as XML text in
 // the form of Zel_SettingList::toXML.
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_GetApplicationSettingsRes.h"
 #include "Zel_GetSettingsCB.h"

@@ -5,7 +5,7 @@
 // the first record, reports its changes through the transaction (published
 // to the sessions' listeners after commit), and answers with snapshots taken
 // after the change.
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_AddDependencyRes.h"
 #include "Zel_ConditionalSetPropertiesCB.h"

@@ -1,6 +1,6 @@
 #include "Zel_MemoryTree.h"
 
-#include "memory_session_p.h"
+#include "session_p.h"
 #include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 

@@ -2,8 +2,8 @@
 // on the primitives of the storage interface (store_p.h), so that every
 // store answers alike: paths, permissions inherited from above, reservations
 // below a node, depth and height against the depth limit, unique names.
-#ifndef ZEL_MEMORY_RULES_P_H
-#define ZEL_MEMORY_RULES_P_H
+#ifndef ZEL_SERVER_RULES_P_H
+#define ZEL_SERVER_RULES_P_H
 
 #include "store_p.h"
 
@@ -61,7 +61,8 @@ inline bool isReserved(ReadTxn& txn, const Reservation& reservation)
 // stored properties, and Locked By / Locked On while it is reserved.
 Zel_PropertyList nodeProperties(ReadTxn& txn, const Node& node);
 
-// One node (and its subtree) in the form of the tree file (memory_json.cpp).
+// One node (and its subtree) in the form of the tree file (written by the
+// tree file code, stores/memory/memory_json.cpp).
 QByteArray nodeJson(ReadTxn& txn, const Node& node);
 
 } // namespace ZelMemory

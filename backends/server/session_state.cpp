@@ -1,4 +1,4 @@
-#include "memory_session_p.h"
+#include "session_p.h"
 
 #include "Zel_MemoryNode.h"
 

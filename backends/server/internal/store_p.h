@@ -33,8 +33,8 @@
 // - now() is the transaction's clock: the store's clock (settable, for tests
 //   of reservation expiry), read when the transaction first asks and then
 //   the same for its whole work.
-#ifndef ZEL_MEMORY_STORE_P_H
-#define ZEL_MEMORY_STORE_P_H
+#ifndef ZEL_SERVER_STORE_P_H
+#define ZEL_SERVER_STORE_P_H
 
 #include <QDateTime>
 #include <QList>

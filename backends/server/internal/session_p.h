@@ -15,8 +15,8 @@
 // that is cancelled, or whose work could not even answer, still answers with
 // a failure and the end notice (makeCanceledResult), so that no callback
 // waits for ever.
-#ifndef MEMORY_SESSION_P_H
-#define MEMORY_SESSION_P_H
+#ifndef ZEL_SERVER_SESSION_P_H
+#define ZEL_SERVER_SESSION_P_H
 
 #include "rules_p.h"
 #include "Zel_MemoryError.h"
@@ -230,7 +230,7 @@ struct ReleaseInOrder {
     }
 };
 
-// Operations whose results release their snapshots in order (memory_ops_p.h).
+// Operations whose results release their snapshots in order (ops_p.h).
 template <class Op>
 struct ReleasesInOrder : std::false_type {
 };

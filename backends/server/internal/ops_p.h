@@ -3,13 +3,13 @@
 // Each operation names the callback it answers, the result class it answers
 // with (the library's where it defines one, MemoryRes otherwise), whether it
 // needs a logged-in user, its arguments, and its work run(). execute() is
-// runOperation() (memory_session_p.h) instantiated in the operation's source
+// runOperation() (session_p.h) instantiated in the operation's source
 // file, so this header needs only the callback and result names.
-#ifndef MEMORY_OPS_P_H
-#define MEMORY_OPS_P_H
+#ifndef ZEL_SERVER_OPS_P_H
+#define ZEL_SERVER_OPS_P_H
 
-#include "memory_results_p.h"
-#include "memory_session_p.h"
+#include "results_p.h"
+#include "session_p.h"
 
 #include "Zel_DependencySPList.h"
 #include "Zel_Directory.h"
@@ -110,7 +110,7 @@ class Zel_SetUserSettingsRes;
 class Zel_SettingsRes;
 class Zel_StartupRes;
 
-// A failure as the only answer of a library result (memory_failures.cpp).
+// A failure as the only answer of a library result (failures.cpp).
 void failInto(Zel_AddDependencyRes& result, const boost::shared_ptr<Zel_Error>& error);
 void failInto(Zel_AssociationsRes& result, const boost::shared_ptr<Zel_Error>& error);
 void failInto(Zel_CheckinRes& result, const boost::shared_ptr<Zel_Error>& error);
@@ -142,7 +142,7 @@ namespace ZelMemory {
 
 typedef boost::shared_ptr<QString> MonikerSP;
 
-// Shared by the operations (memory_ops_browse.cpp).
+// Shared by the operations (ops/browse.cpp).
 boost::shared_ptr<Zel_Error> ok();
 boost::shared_ptr<QString> sharedText(const QString& text);
 // The children of the node the user may read, as snapshots in node order
@@ -151,7 +151,7 @@ std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node
 // The node's locators (restrictions = false) or restrictions (true).
 QList<Zel_FrameLocator> markersOf(const Node& node, bool restrictions);
 // Fails with TooDeep unless a subtree of the given height (0: one node) fits
-// below parent within MaxDepth (memory_ops_change.cpp).
+// below parent within MaxDepth (ops/change.cpp).
 void requireDepth(Work& work, const Node& parent, int height);
 // Reports node as updated under its parent (none for the root).
 void reportUpdated(WriteWork& work, const Node& node);

@@ -1,8 +1,8 @@
 #include "Zel_MemorySession.h"
 #include "zel_version.h"
 
-#include "memory_ops_p.h"
-#include "memory_session_p.h"
+#include "ops_p.h"
+#include "session_p.h"
 #include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 #include "Zel_MemoryTree.h"
