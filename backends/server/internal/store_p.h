@@ -245,8 +245,15 @@ public:
     virtual const Node* nodeByMoniker(const QString& moniker) = 0;
     // The node whose media object ID is mobId (not empty), or null.
     virtual const Node* nodeByMobId(const QString& mobId) = 0;
+    // Calls visit with each child of parent, in the order they were added
+    // (one pass: a large folder's records are visited where they lie).
+    virtual void forEachChild(const Node& parent, const std::function<void(const Node&)>& visit) = 0;
     // Appends the children of parent to out, in the order they were added.
-    virtual void children(const Node& parent, std::vector<const Node*>& out) = 0;
+    void children(const Node& parent, std::vector<const Node*>& out)
+    {
+        out.reserve(out.size() + static_cast<std::size_t>(childCount(parent)));
+        forEachChild(parent, [&out](const Node& child) { out.push_back(&child); });
+    }
     virtual int childCount(const Node& node) = 0;
     // The child of parent named name (exact), or null.
     virtual const Node* childNamed(const Node& parent, const QString& name) = 0;

@@ -56,19 +56,18 @@ std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node
     // Where the answer releases its snapshots in order, it gets them in the
     // order taken.
     const SnapshotContext context = childContext(work.txn, &parent, work.user);
-    std::vector<const Node*> records;
-    work.txn.children(parent, records);
+    const std::size_t count = static_cast<std::size_t>(work.txn.childCount(parent));
     std::vector<boost::shared_ptr<Zel_Node>> children;
-    children.reserve(records.size());
+    children.reserve(count);
     if (work.releasedInOrder)
-        work.releasedInOrder->reserve(work.releasedInOrder->size() + records.size());
-    for (const Node* child : records) {
-        if (permissionsBelow(context.account, *child, context.permissions) & PermRead) {
-            children.push_back(work.snapshot(*child, context));
+        work.releasedInOrder->reserve(work.releasedInOrder->size() + count);
+    work.txn.forEachChild(parent, [&](const Node& child) {
+        if (permissionsBelow(context.account, child, context.permissions) & PermRead) {
+            children.push_back(work.snapshot(child, context));
             if (work.releasedInOrder)
                 work.releasedInOrder->push_back(children.back());
         }
-    }
+    });
     Zel_NodeList::sortByOrder(children);
     return children;
 }

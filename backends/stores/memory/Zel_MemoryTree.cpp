@@ -126,11 +126,10 @@ QList<boost::shared_ptr<Zel_Node>> Zel_MemoryTree::childSnapshots(const boost::s
     if (!parent)
         return nodes;
     const ZelMemory::SnapshotContext context = ZelMemory::childContext(*txn, parent, user);
-    std::vector<const ZelMemory::Node*> children;
-    txn->children(*parent, children);
-    nodes.reserve(static_cast<int>(children.size()));
-    for (const ZelMemory::Node* child : children)
-        nodes.append(ZelMemory::snapshotOf(*txn, *child, context, owner));
+    nodes.reserve(txn->childCount(*parent));
+    txn->forEachChild(*parent, [&](const ZelMemory::Node& child) {
+        nodes.append(ZelMemory::snapshotOf(*txn, child, context, owner));
+    });
     txn->commit();
     return nodes;
 }

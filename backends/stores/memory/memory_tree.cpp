@@ -287,13 +287,11 @@ public:
         }
         return nullptr;
     }
-    void children(const Node& parent, std::vector<const Node*>& out) override
+    void forEachChild(const Node& parent, const std::function<void(const Node&)>& visit) override
     {
-        const QStringList& ids = stored(parent).children;
-        out.reserve(out.size() + static_cast<std::size_t>(ids.size()));
-        for (const QString& id : ids) {
+        for (const QString& id : stored(parent).children) {
             if (const StoredNode* child = mTree.byId(id))
-                out.push_back(child);
+                visit(*child);
         }
     }
     int childCount(const Node& node) override { return stored(node).children.size(); }
