@@ -350,7 +350,8 @@ public:
     };
     Savepoint savepoint() { return Savepoint{setSavepoint(), mChanges.size(), effectCount()}; }
     // Undoes every change, report and effect made since the savepoint; the
-    // savepoint stays usable.
+    // savepoint stays usable. Records removed and put back by the rollback
+    // are new records: look them up again.
     void rollbackTo(const Savepoint& point)
     {
         rollbackToSavepoint(point.store);
