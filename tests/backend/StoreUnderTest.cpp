@@ -25,7 +25,11 @@ public:
     QByteArray toJson() override { return mTree->toJson(); }
     int nodeCount() override { return mTree->nodeCount(); }
     QString monikerAt(const QString& path) override { return mTree->monikerAt(path); }
-    void setClock(std::function<QDateTime()> clock) override { mTree->data().setClock(std::move(clock)); }
+    void setClock(std::function<QDateTime()> clock) override
+    {
+        ZelMemory::Store& store = mTree->data();
+        store.setClock(std::move(clock));
+    }
 
 private:
     boost::shared_ptr<Zel_MemoryTree> mTree;

@@ -420,7 +420,7 @@ ZelMemory::Node newBin(const QString& name)
 TEST(Zel_MemoryTreeTest, WriteTransactionWithoutCommitLeavesTheTreeAsItWasAndTellsNobody)
 {
     const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
-    ZelMemory::Tree& store = tree->data();
+    ZelMemory::Store& store = tree->data(); // through the interface, as the rules see it
     const boost::shared_ptr<HeardChanges> heard = boost::make_shared<HeardChanges>();
     store.addObserver(heard);
     const QByteArray before = tree->toJson();
@@ -453,7 +453,7 @@ TEST(Zel_MemoryTreeTest, WriteTransactionWithoutCommitLeavesTheTreeAsItWasAndTel
         txn->setUserSettings(QStringLiteral("editor"), 0, {});
         txn->setUserSettings(QStringLiteral("assistant"), 2, {qMakePair(QStringLiteral("S"), QStringLiteral("3"))});
         txn->setDocument(QStringLiteral("Layout"), QStringLiteral("<Layout/>"));
-        txn->reportAdded(monikerOf("B-FOOTAGE"), fresh.moniker);
+        txn->reportAdded(monikerOf("B-FOOTAGE"), firstNewMoniker); // fresh went with Footage
         txn->onCommit([&effectRan] { effectRan = true; });
         EXPECT_EQ(2, txn->childCount(*archive)); // the election clip and the moved one
     }
@@ -480,7 +480,7 @@ TEST(Zel_MemoryTreeTest, WriteTransactionWithoutCommitLeavesTheTreeAsItWasAndTel
 TEST(Zel_MemoryTreeTest, RollingBackToASavepointUndoesOnlyWhatCameAfterIt)
 {
     const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
-    ZelMemory::Tree& store = tree->data();
+    ZelMemory::Store& store = tree->data(); // through the interface, as the rules see it
     const boost::shared_ptr<HeardChanges> heard = boost::make_shared<HeardChanges>();
     store.addObserver(heard);
     QStringList effects;
