@@ -25,11 +25,8 @@ public:
     QByteArray toJson() override { return mTree->toJson(); }
     int nodeCount() override { return mTree->nodeCount(); }
     QString monikerAt(const QString& path) override { return mTree->monikerAt(path); }
-    void setClock(std::function<QDateTime()> clock) override
-    {
-        ZelMemory::Store& store = mTree->data();
-        store.setClock(std::move(clock));
-    }
+    ZelMemory::Store& records() override { return mTree->data(); }
+    void setClock(std::function<QDateTime()> clock) override { records().setClock(std::move(clock)); }
 
 private:
     boost::shared_ptr<Zel_MemoryTree> mTree;

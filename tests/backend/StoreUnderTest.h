@@ -23,6 +23,10 @@
 class Orv_Engine;
 class Zel_MemorySession;
 
+namespace ZelMemory {
+class Store;
+}
+
 // One store holding a tree, as the tests see it.
 class StoreUnderTest
 {
@@ -36,6 +40,8 @@ public:
     virtual int nodeCount() = 0;
     // The moniker of the node at a path of names below the root; empty if none.
     virtual QString monikerAt(const QString& path) = 0;
+    // The store itself, through the storage interface of the server rules.
+    virtual ZelMemory::Store& records() = 0;
     // The clock of the store's transactions from now on.
     virtual void setClock(std::function<QDateTime()> clock) = 0;
 };
