@@ -12,6 +12,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <stdexcept>
 #include <vector>
 
 namespace {
@@ -161,4 +162,43 @@ TEST_P(StoreTest, RollingBackToASavepointUndoesOnlyWhatCameAfterIt)
     ASSERT_FALSE(mayor->properties.isEmpty());
     EXPECT_EQ(QStringLiteral("T-1"), mayor->properties.last().value);
     EXPECT_GT(mayor->properties.size(), 1); // the properties cleared after the savepoint are back
+}
+
+TEST_P(StoreTest, EffectThatThrowsAfterCommitKeepsTheChangeAndItsReport)
+{
+    ZelMemory::Store& store = tree->records();
+    const boost::shared_ptr<HeardChanges> heard = boost::make_shared<HeardChanges>();
+    store.addObserver(heard);
+    QStringList effects;
+    QString moniker;
+    {
+        const std::unique_ptr<ZelMemory::WriteTxn> txn = store.beginWrite();
+        const ZelMemory::Node& added = txn->insertNode(newBin(QStringLiteral("Kept")), *txn->nodeByMoniker(monikerOf("B-FOOTAGE")));
+        moniker = added.moniker;
+        txn->reportAdded(monikerOf("B-FOOTAGE"), moniker);
+        txn->onCommit([&effects] { effects << QStringLiteral("first"); });
+        txn->onCommit([&effects] {
+            effects << QStringLiteral("throws");
+            throw std::runtime_error("effect failed");
+        });
+        txn->onCommit([&effects] { effects << QStringLiteral("last"); });
+        try {
+            txn->commit();
+            ADD_FAILURE() << "the effect's exception was swallowed";
+        } catch (const std::runtime_error& e) {
+            EXPECT_STREQ("effect failed", e.what());
+        }
+        EXPECT_TRUE(txn->isCommitted());
+    }
+    EXPECT_EQ((QStringList{QStringLiteral("first"), QStringLiteral("throws"), QStringLiteral("last")}), effects);
+    EXPECT_EQ(QStringList{QStringLiteral("added zel-mem://B-FOOTAGE ") + moniker}, heard->lines);
+    EXPECT_EQ(moniker, tree->monikerAt(QStringLiteral("/Evening News/Footage/Kept")));
+
+    // The store's next batch is not held up behind the one whose effect threw.
+    {
+        const std::unique_ptr<ZelMemory::WriteTxn> txn = store.beginWrite();
+        txn->reportUpdated(monikerOf("B-FOOTAGE"), moniker);
+        txn->commit();
+    }
+    EXPECT_EQ(2, heard->lines.size());
 }

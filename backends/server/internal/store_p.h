@@ -51,6 +51,7 @@
 #include <algorithm>
 #include <atomic>
 #include <cstdint>
+#include <exception>
 #include <functional>
 #include <memory>
 #include <mutex>
@@ -279,7 +280,8 @@ public:
     // Commits: the store makes the work durable (or, for reading, ends it),
     // then the registered effects run in order, then the change reports go
     // out. A transaction is committed at most once; a failure to commit
-    // throws and leaves it rolled back.
+    // throws and leaves it rolled back. An effect's exception is thrown once
+    // the change reports are out (the data stays committed).
     inline void commit();
     bool isCommitted() const { return mCommitted; }
 
@@ -435,11 +437,24 @@ void ReadTxn::commit()
     mCommitted = true;
     // The effects, then the change reports: an application that hears of a
     // change finds its effects (a registered property key, ...) in place.
+    // An effect that throws stops neither the others nor the reports of what
+    // is committed; the first exception is thrown on afterwards.
     const std::vector<std::function<void()>> effects = std::move(mEffects);
     mEffects.clear();
-    for (const std::function<void()>& effect : effects)
-        effect();
+    std::exception_ptr failure;
+    for (const std::function<void()>& effect : effects) {
+        try {
+            effect();
+        } catch (...) {
+            if (!std::current_exception())
+                throw; // the unwinding that ends a thread goes on
+            if (!failure)
+                failure = std::current_exception();
+        }
+    }
     publishCommitted();
+    if (failure)
+        std::rethrow_exception(failure);
 }
 
 } // namespace ZelMemory
