@@ -9,6 +9,7 @@
 #include "Zel_MemoryErrorCodes.h"
 #include "Zel_MemorySession.h"
 #include "Zel_MemoryTree.h"
+#include "StoreUnderTest.h"
 
 // Every request class: submitting one needs its complete type.
 #include "zel_request_headers.h"
@@ -84,6 +85,8 @@
 #include <boost/shared_ptr.hpp>
 
 #include <gtest/gtest.h>
+
+#include <memory>
 
 #include <mutex>
 
@@ -425,14 +428,15 @@ const char* const Highlights = "B-HIGHLIGHTS";
 const char* const MayorMob = "060a2b340101010101010f00.13000000.0001";
 } // namespace Sample
 
-// An engine, the sample tree and one session, logged in as the given user.
-class BackendFixture : public ::testing::Test
+// An engine, a store of the kind under test holding the sample tree, and one
+// session on it, logged in as the given user.
+class BackendFixture : public ::testing::TestWithParam<StoreKind>
 {
 protected:
     void SetUp() override
     {
-        tree = Zel_MemoryTree::sample();
-        ASSERT_TRUE(tree);
+        store = load(Zel_MemoryTree::sampleJson());
+        ASSERT_TRUE(store);
         session = newSession();
     }
     void TearDown() override
@@ -441,9 +445,18 @@ protected:
         session.reset();
     }
 
+    // A fresh store of the kind under test holding the tree of the JSON text.
+    std::unique_ptr<StoreUnderTest> load(const QByteArray& json)
+    {
+        QString error;
+        std::unique_ptr<StoreUnderTest> loaded = GetParam().load(json, &error);
+        EXPECT_TRUE(loaded) << error.toStdString();
+        return loaded;
+    }
+
     boost::shared_ptr<Zel_MemorySession> newSession(const QString& user = QStringLiteral("editor"))
     {
-        boost::shared_ptr<Zel_MemorySession> s(new Zel_MemorySession(tree, &engine, QStringLiteral("zel-demo")));
+        boost::shared_ptr<Zel_MemorySession> s = store->newSession(&engine, QStringLiteral("zel-demo"));
         if (!user.isEmpty()) {
             auto login = rec<LoginRec>();
             s->submitRequest(s->makeLoginReqSP(user, user, boost::shared_ptr<Zel_LoginCredentials>(), login));
@@ -463,7 +476,7 @@ protected:
     }
 
     Orv_Engine engine{2};
-    boost::shared_ptr<Zel_MemoryTree> tree;
+    std::unique_ptr<StoreUnderTest> store;
     boost::shared_ptr<Zel_MemorySession> session;
 };
 

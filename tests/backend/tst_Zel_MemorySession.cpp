@@ -1,5 +1,7 @@
 // End-to-end: every request class through the engine and its worker threads,
-// against the sample tree, with its answers, its failures and its events.
+// against the sample tree, with its answers, its failures and its events. The
+// suite of the server rules: every test runs on every kind of store
+// (StoreUnderTest.h); tests of the in-memory tree alone say so.
 #include "BackendRecorders.h"
 #include "zel_version.h"
 
@@ -15,6 +17,7 @@
 #include <QSet>
 
 #include <algorithm>
+#include <atomic>
 #include <functional>
 #include <memory>
 #include <new>
@@ -27,7 +30,9 @@ using namespace Sample;
 
 typedef BackendFixture Zel_MemorySessionTest;
 
-TEST_F(Zel_MemorySessionTest, RequestsBeforeLoginFailAndWrongPasswordIsRejected)
+INSTANTIATE_TEST_SUITE_P(Store, Zel_MemorySessionTest, ::testing::ValuesIn(storeKinds()), StoreKindName());
+
+TEST_P(Zel_MemorySessionTest, RequestsBeforeLoginFailAndWrongPasswordIsRejected)
 {
     boost::shared_ptr<Zel_MemorySession> anonymous = newSession(QString());
     auto node = rec<NodeRec>();
@@ -52,7 +57,7 @@ TEST_F(Zel_MemorySessionTest, RequestsBeforeLoginFailAndWrongPasswordIsRejected)
     EXPECT_FALSE(anonymous->isLoggedIn());
 }
 
-TEST_F(Zel_MemorySessionTest, BrowsingRequestsAnswerNodesInNodeOrder)
+TEST_P(Zel_MemorySessionTest, BrowsingRequestsAnswerNodesInNodeOrder)
 {
     auto root = rec<RootNodeRec>();
     run(session->makeRootNodeReqSP(root));
@@ -158,7 +163,7 @@ TEST_F(Zel_MemorySessionTest, BrowsingRequestsAnswerNodesInNodeOrder)
     EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidArgument}, emptyQuery->codes);
 }
 
-TEST_F(Zel_MemorySessionTest, PropertiesPermissionsReservationsAndResolutions)
+TEST_P(Zel_MemorySessionTest, PropertiesPermissionsReservationsAndResolutions)
 {
     auto list = rec<PropertiesRec>();
     run(session->makePropertyListReqSP(mk(m(Mayor)), list));
@@ -218,10 +223,10 @@ TEST_F(Zel_MemorySessionTest, PropertiesPermissionsReservationsAndResolutions)
     EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotMedia}, notMedia->codes);
 }
 
-TEST_F(Zel_MemorySessionTest, ChangesAnswerTheChangedNodesAndReachFolderListenersInOrder)
+TEST_P(Zel_MemorySessionTest, ChangesAnswerTheChangedNodesAndReachFolderListenersInOrder)
 {
     FolderRec footage(m(Footage), session);
-    const int before = tree->nodeCount();
+    const int before = store->nodeCount();
 
     auto created = rec<CreateFolderRec>();
     run(session->makeCreateFolderReqSP(mk(m(Footage)), QStringLiteral("Rushes"), created));
@@ -269,7 +274,7 @@ TEST_F(Zel_MemorySessionTest, ChangesAnswerTheChangedNodesAndReachFolderListener
     run(session->makeDeleteNodeReqSP(mk(unique->nodes[0]->getMoniker()), deleted));
     EXPECT_EQ((QStringList{QStringLiteral("ok true"), QStringLiteral("finished")}), deleted->log);
 
-    EXPECT_EQ(before + 3 + 3 - 1, tree->nodeCount()); // three created, three copied, one deleted
+    EXPECT_EQ(before + 3 + 3 - 1, store->nodeCount()); // three created, three copied, one deleted
     const QString copy = copied->nodes[0]->getMoniker();
     EXPECT_EQ((QStringList{QStringLiteral("added ") + rushes, QStringLiteral("added ") + unique->nodes[0]->getMoniker(),
                            QStringLiteral("updated ") + rushes, QStringLiteral("updated ") + unique->nodes[0]->getMoniker(),
@@ -278,9 +283,9 @@ TEST_F(Zel_MemorySessionTest, ChangesAnswerTheChangedNodesAndReachFolderListener
               footage.events());
 }
 
-TEST_F(Zel_MemorySessionTest, FailuresAreDataAndLeaveTheTreeUnchanged)
+TEST_P(Zel_MemorySessionTest, FailuresAreDataAndLeaveTheTreeUnchanged)
 {
-    const QByteArray before = tree->toJson();
+    const QByteArray before = store->toJson();
     FolderRec footage(m(Footage), session);
 
     auto unknown = rec<RenameNodeRec>();
@@ -335,11 +340,11 @@ TEST_F(Zel_MemorySessionTest, FailuresAreDataAndLeaveTheTreeUnchanged)
     run(session->makeCheckinReqSP(Zel_MobDescList(), mk(m(Archive)), failedCheckin));
     EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::PermissionDenied}, failedCheckin->codes);
 
-    EXPECT_EQ(before, tree->toJson());
+    EXPECT_EQ(before, store->toJson());
     EXPECT_TRUE(footage.events().isEmpty()) << footage.events().join(QLatin1Char(',')).toStdString();
 }
 
-TEST_F(Zel_MemorySessionTest, ReservationsLocatorsDependenciesAndConditionalSets)
+TEST_P(Zel_MemorySessionTest, ReservationsLocatorsDependenciesAndConditionalSets)
 {
     auto reserve = rec<CreateReservationRec>();
     run(session->makeCreateReservationReqSP(mk(m(Mayor)), QDateTime::currentDateTimeUtc().addSecs(3600), reserve));
@@ -436,7 +441,7 @@ TEST_F(Zel_MemorySessionTest, ReservationsLocatorsDependenciesAndConditionalSets
     EXPECT_EQ(QStringLiteral("NEW"), old->nodes[0]->getPropertyValue(QStringLiteral("Tape")));
 }
 
-TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
+TEST_P(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
 {
     FolderRec footage(m(Footage), session);
     auto analyze = rec<AnalyzeRec>();
@@ -512,7 +517,7 @@ TEST_F(Zel_MemorySessionTest, MediaCheckInDeletionAndBinaryForms)
               footage.events());
 }
 
-TEST_F(Zel_MemorySessionTest, SettingsRoundTripAsXml)
+TEST_P(Zel_MemorySessionTest, SettingsRoundTripAsXml)
 {
     auto startup = rec<StartupRec>();
     run(session->makeStartupReqSP(startup));
@@ -571,7 +576,7 @@ TEST_F(Zel_MemorySessionTest, SettingsRoundTripAsXml)
     EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::NotFound}, none->codes);
 }
 
-TEST_F(Zel_MemorySessionTest, ConnectionLossIsAnnouncedAndFailsRequestsUntilReconnected)
+TEST_P(Zel_MemorySessionTest, ConnectionLossIsAnnouncedAndFailsRequestsUntilReconnected)
 {
     boost::shared_ptr<StatusRec> status(new StatusRec);
     session->setStatusNotificationCB(status);
@@ -590,7 +595,7 @@ TEST_F(Zel_MemorySessionTest, ConnectionLossIsAnnouncedAndFailsRequestsUntilReco
     EXPECT_EQ((QStringList{QStringLiteral("disconnected"), QStringLiteral("connected")}), status->log);
 }
 
-TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
+TEST_P(Zel_MemorySessionTest, SessionStateAndClose)
 {
     EXPECT_EQ(QStringLiteral("Newsroom Asset Server (in memory)"), session->getServerName());
     EXPECT_EQ(QStringLiteral("zel-memory 1.0.0"), session->getServerVersion());
@@ -629,6 +634,8 @@ TEST_F(Zel_MemorySessionTest, SessionStateAndClose)
     EXPECT_FALSE(session->submitRequest(boost::shared_ptr<Orv_Request>()));
 }
 
+// Of the in-memory tree alone: the expected order is worked out from the
+// tree's own snapshots (Zel_MemoryTree::childSnapshots).
 TEST(Zel_MemorySessionOrderTest, ChildrenComeInTheOrderAStableSortByNodeOrderGives)
 {
     // Random folders: mixed mime types, names that differ only in case, long
@@ -716,7 +723,7 @@ TEST(Zel_MemorySessionOrderTest, ChildrenComeInTheOrderAStableSortByNodeOrderGiv
     }
 }
 
-TEST_F(Zel_MemorySessionTest, CancelAllReachesEveryLiveRequestAmongManyMadeAndDropped)
+TEST_P(Zel_MemorySessionTest, CancelAllReachesEveryLiveRequestAmongManyMadeAndDropped)
 {
     // The session forgets requests that are gone only now and then; however
     // many were made and dropped in between, every request still alive is
@@ -743,7 +750,7 @@ TEST_F(Zel_MemorySessionTest, CancelAllReachesEveryLiveRequestAmongManyMadeAndDr
     EXPECT_TRUE(after->log.value(0).startsWith(QStringLiteral("ok "))) << after->log.join(QLatin1Char('|')).toStdString();
 }
 
-TEST_F(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives)
+TEST_P(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives)
 {
     const boost::shared_ptr<Zel_PropertyManager> own = Zel_Property::getPropertyManagerSP();
     ASSERT_TRUE(own);
@@ -756,7 +763,9 @@ TEST_F(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives
 
     // A session on another tree takes over while it lives and hands back after.
     {
-        Zel_MemorySession other(Zel_MemoryTree::sample(), &engine, QStringLiteral("other"));
+        const std::unique_ptr<StoreUnderTest> otherStore = load(Zel_MemoryTree::sampleJson());
+        ASSERT_TRUE(otherStore);
+        const boost::shared_ptr<Zel_MemorySession> other = otherStore->newSession(&engine, QStringLiteral("other"));
         EXPECT_NE(own, Zel_Property::getPropertyManagerSP());
         EXPECT_TRUE(Zel_Property::getPropertyManagerSP());
     }
@@ -767,7 +776,7 @@ TEST_F(Zel_MemorySessionTest, PropertyManagerStaysRegisteredWhileAnySessionLives
     EXPECT_FALSE(Zel_Property::getPropertyManagerSP());
 }
 
-TEST_F(Zel_MemorySessionTest, ExpiredReservationIsReportedAsFree)
+TEST_P(Zel_MemorySessionTest, ExpiredReservationIsReportedAsFree)
 {
     // The sample tree with the bulletin's reservation run out in the past.
     QByteArray json = Zel_MemoryTree::sampleJson();
@@ -775,9 +784,9 @@ TEST_F(Zel_MemorySessionTest, ExpiredReservationIsReportedAsFree)
     ASSERT_TRUE(json.contains(held));
     json.replace(held, "\"reservation\": { \"user\": \"producer\", \"since\": \"2020-01-01T09:00:00Z\", "
                        "\"until\": \"2020-01-01T10:00:00Z\" }");
-    QString error;
-    tree = Zel_MemoryTree::fromJson(json, QStringLiteral("expired.json"), &error);
-    ASSERT_TRUE(tree) << error.toStdString();
+    session.reset();
+    store = load(json);
+    ASSERT_TRUE(store);
     session = newSession();
 
     auto get = rec<NodeRec>();
@@ -799,7 +808,56 @@ TEST_F(Zel_MemorySessionTest, ExpiredReservationIsReportedAsFree)
     EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), reserve->log);
 }
 
-TEST_F(Zel_MemorySessionTest, NamesTheServerMakesStayWithinTheNameLimit)
+TEST_P(Zel_MemorySessionTest, ReservationsEndWhenTheStoreClockPassesTheirEnd)
+{
+    // The store's clock, moved by the test between requests: expiry is judged
+    // by each request's transaction time, not by the machine's clock.
+    const QDateTime start(QDate(2030, 1, 1), QTime(10, 0), Qt::UTC);
+    const QDateTime end = start.addSecs(3600);
+    const std::shared_ptr<std::atomic<qint64>> clock = std::make_shared<std::atomic<qint64>>(start.toMSecsSinceEpoch());
+    store->setClock([clock] { return QDateTime::fromMSecsSinceEpoch(clock->load(), Qt::UTC); });
+
+    const boost::shared_ptr<Zel_MemorySession> producer = newSession(QStringLiteral("producer"));
+    auto reserve = rec<CreateReservationRec>();
+    run(producer->makeCreateReservationReqSP(mk(m(Mayor)), end, reserve), producer);
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), reserve->log);
+    auto held = rec<ReservationsRec>();
+    run(session->makeGetReservationsReqSP(mk(m(Mayor)), held));
+    EXPECT_EQ((QStringList{QStringLiteral("ok producer 2030-01-01T11:00:00Z"), QStringLiteral("finished")}), held->log);
+    auto node = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Mayor)), node));
+    ASSERT_EQ(1, node->nodes.size());
+    EXPECT_TRUE(node->nodes[0]->isReserved());
+    EXPECT_EQ(QStringLiteral("2030-01-01T10:00:00Z"), node->nodes[0]->getPropertyValue(QStringLiteral("Locked On")));
+
+    // A second before its end the reservation still holds.
+    clock->store(end.addSecs(-1).toMSecsSinceEpoch());
+    auto renamed = rec<RenameNodeRec>();
+    run(session->makeRenameNodeReqSP(mk(m(Mayor)), QStringLiteral("Mayor later"), renamed));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::ReservedByOtherUser}, renamed->codes);
+    auto past = rec<CreateReservationRec>();
+    run(session->makeCreateReservationReqSP(mk(m(Mayor)), end.addSecs(-2), past));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::ReservedByOtherUser}, past->codes);
+
+    // At its end the node is free, shown free, and taken at the store's time.
+    clock->store(end.toMSecsSinceEpoch());
+    auto free = rec<ReservationsRec>();
+    run(session->makeGetReservationsReqSP(mk(m(Mayor)), free));
+    EXPECT_EQ(QStringList{QStringLiteral("finished")}, free->log);
+    auto late = rec<CreateReservationRec>();
+    run(session->makeCreateReservationReqSP(mk(m(Mayor)), end.addSecs(-1), late));
+    EXPECT_EQ(QList<int>{Zel_MemoryErrorCodes::InvalidArgument}, late->codes);
+    auto taken = rec<CreateReservationRec>();
+    run(session->makeCreateReservationReqSP(mk(m(Mayor)), QDateTime(), taken));
+    EXPECT_EQ((QStringList{QStringLiteral("ok "), QStringLiteral("finished")}), taken->log);
+    auto mine = rec<NodeRec>();
+    run(session->makeGetNodeReqSP(mk(m(Mayor)), mine));
+    ASSERT_EQ(1, mine->nodes.size());
+    EXPECT_EQ(QStringLiteral("editor"), mine->nodes[0]->getPropertyValue(QStringLiteral("Locked By")));
+    EXPECT_EQ(QStringLiteral("2030-01-01T11:00:00Z"), mine->nodes[0]->getPropertyValue(QStringLiteral("Locked On")));
+}
+
+TEST_P(Zel_MemorySessionTest, NamesTheServerMakesStayWithinTheNameLimit)
 {
     const QString longest(session->getMaxNameLength(), QLatin1Char('x'));
     auto first = rec<CreateFolderUniqueRec>();
@@ -832,7 +890,7 @@ TEST_F(Zel_MemorySessionTest, NamesTheServerMakesStayWithinTheNameLimit)
     }
 }
 
-TEST_F(Zel_MemorySessionTest, FoldersNestOnlyToTheDepthLimitAndSuchATreeLoadsBack)
+TEST_P(Zel_MemorySessionTest, FoldersNestOnlyToTheDepthLimitAndSuchATreeLoadsBack)
 {
     using Zel_MemoryLimits::MaxDepth;
     // A chain of bins below Footage (depth 2), the last at the limit.
@@ -882,11 +940,10 @@ TEST_F(Zel_MemorySessionTest, FoldersNestOnlyToTheDepthLimitAndSuchATreeLoadsBac
     EXPECT_EQ((QStringList{QStringLiteral("ok Effects"), QStringLiteral("finished")}), movedHigher->log);
 
     // Everything the requests built saves and loads back the same.
-    const QByteArray saved = tree->toJson();
-    QString error;
-    boost::shared_ptr<Zel_MemoryTree> again = Zel_MemoryTree::fromJson(saved, QStringLiteral("deep.json"), &error);
-    ASSERT_TRUE(again) << error.toStdString();
-    EXPECT_EQ(tree->nodeCount(), again->nodeCount());
+    const QByteArray saved = store->toJson();
+    const std::unique_ptr<StoreUnderTest> again = load(saved);
+    ASSERT_TRUE(again);
+    EXPECT_EQ(store->nodeCount(), again->nodeCount());
     EXPECT_EQ(saved, again->toJson());
     QString path = QStringLiteral("/Evening News/Footage");
     for (int depth = 3; depth <= MaxDepth; ++depth)
@@ -894,16 +951,16 @@ TEST_F(Zel_MemorySessionTest, FoldersNestOnlyToTheDepthLimitAndSuchATreeLoadsBac
     EXPECT_EQ(deepest, again->monikerAt(path));
 
     // Deleting the chain takes its whole subtree.
-    const int before = tree->nodeCount();
+    const int before = store->nodeCount();
     auto deleted = rec<BoolRec>();
     run(session->makeDeleteNodeReqSP(mk(chain.at(2)), deleted));
     EXPECT_EQ((QStringList{QStringLiteral("ok true"), QStringLiteral("finished")}), deleted->log);
-    EXPECT_EQ(before - (MaxDepth - 2) - 3 - 3, tree->nodeCount()); // the chain, the copied and the moved effects
+    EXPECT_EQ(before - (MaxDepth - 2) - 3 - 3, store->nodeCount()); // the chain, the copied and the moved effects
 }
 
-TEST_F(Zel_MemorySessionTest, CreateNodeUniqueRefusesAMediaObjectIdInUse)
+TEST_P(Zel_MemorySessionTest, CreateNodeUniqueRefusesAMediaObjectIdInUse)
 {
-    const QByteArray before = tree->toJson();
+    const QByteArray before = store->toJson();
     Zel_PropertyList props;
     props.append(Zel_Property(QStringLiteral("MobID"), QLatin1String(MayorMob), QString()));
     auto taken = rec<NodeRec>();
@@ -912,7 +969,7 @@ TEST_F(Zel_MemorySessionTest, CreateNodeUniqueRefusesAMediaObjectIdInUse)
     EXPECT_EQ(QStringLiteral("The media object ID \"%1\" belongs to \"Interview Mayor\" (%2) already.")
                   .arg(QLatin1String(MayorMob), m(Mayor)),
               taken->messages.value(0));
-    EXPECT_EQ(before, tree->toJson());
+    EXPECT_EQ(before, store->toJson());
 
     const QString fresh = QStringLiteral("060a2b340101010101010f00.13000000.9999");
     props.clear();
@@ -939,7 +996,7 @@ QString repeated(const QString& text, int times)
 
 } // namespace
 
-TEST_F(Zel_MemorySessionTest, SettingsBeyondTheLimitsAreRefusedAndStoredSettingsReadBack)
+TEST_P(Zel_MemorySessionTest, SettingsBeyondTheLimitsAreRefusedAndStoredSettingsReadBack)
 {
     using namespace Zel_MemoryLimits;
     const QList<int> invalid{Zel_MemoryErrorCodes::InvalidArgument};
@@ -1025,7 +1082,7 @@ TEST_F(Zel_MemorySessionTest, SettingsBeyondTheLimitsAreRefusedAndStoredSettings
     EXPECT_FALSE(back.contains(QStringLiteral("TrackHeight")));
 }
 
-TEST_F(Zel_MemorySessionTest, ChangeEventsReachOnlySessionsWhoseUserMayReadTheParent)
+TEST_P(Zel_MemorySessionTest, ChangeEventsReachOnlySessionsWhoseUserMayReadTheParent)
 {
     // The assistant may read the project but not its Archive bin (an empty
     // entry there); the editor may read it; the admin reads everything.
@@ -1080,29 +1137,28 @@ TEST_F(Zel_MemorySessionTest, ChangeEventsReachOnlySessionsWhoseUserMayReadThePa
 
 // The session may outlive its engine: it then refuses requests, and neither
 // that nor its end touches the engine that is gone.
-TEST(Zel_MemorySessionLifetimeTest, SessionOutlivingItsEngineRefusesRequestsAndEndsCleanly)
+TEST_P(Zel_MemorySessionTest, SessionOutlivingItsEngineRefusesRequestsAndEndsCleanly)
 {
-    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
-    std::unique_ptr<Orv_Engine> engine(new Orv_Engine(2));
-    boost::shared_ptr<Zel_MemorySession> session(new Zel_MemorySession(tree, engine.get()));
+    std::unique_ptr<Orv_Engine> ownEngine(new Orv_Engine(2));
+    boost::shared_ptr<Zel_MemorySession> orphan = store->newSession(ownEngine.get(), QStringLiteral("zel"));
     auto login = rec<LoginRec>();
-    ASSERT_TRUE(session->submitRequest(session->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login)));
-    engine->DeliverAll();
+    ASSERT_TRUE(orphan->submitRequest(orphan->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login)));
+    ownEngine->DeliverAll();
     ASSERT_EQ(1, login->ok);
-    std::unique_ptr<FolderRec> footage(new FolderRec(m(Footage), session));
+    std::unique_ptr<FolderRec> footage(new FolderRec(m(Footage), orphan));
 
-    engine.reset();
+    ownEngine.reset();
     auto node = rec<NodeRec>();
-    const boost::shared_ptr<Zel_GetNodeReq> request = session->makeGetNodeReqSP(mk(m(Mayor)), node);
+    const boost::shared_ptr<Zel_GetNodeReq> request = orphan->makeGetNodeReqSP(mk(m(Mayor)), node);
     ASSERT_TRUE(request);
-    EXPECT_FALSE(session->submitRequest(request));
-    EXPECT_FALSE(session->submitRequest(session->makeGetNodeReqSP(mk(m(Mayor)), node)));
+    EXPECT_FALSE(orphan->submitRequest(request));
+    EXPECT_FALSE(orphan->submitRequest(orphan->makeGetNodeReqSP(mk(m(Mayor)), node)));
 
-    // Another session on the same tree, on an engine of its own, changes the
+    // Another session on the same store, on an engine of its own, changes the
     // bin the first one listens to: the report goes nowhere near the old engine.
     {
         Orv_Engine other(1);
-        boost::shared_ptr<Zel_MemorySession> producer(new Zel_MemorySession(tree, &other));
+        boost::shared_ptr<Zel_MemorySession> producer = store->newSession(&other, QStringLiteral("zel"));
         auto login2 = rec<LoginRec>();
         producer->submitRequest(producer->makeLoginReqSP(QStringLiteral("producer"), QStringLiteral("producer"), {}, login2));
         auto created = rec<CreateFolderRec>();
@@ -1112,11 +1168,11 @@ TEST(Zel_MemorySessionLifetimeTest, SessionOutlivingItsEngineRefusesRequestsAndE
     }
     EXPECT_TRUE(footage->events().isEmpty()); // nobody delivers the first session's results any more
     footage.reset();
-    session.reset();
+    orphan.reset();
     EXPECT_TRUE(node->log.isEmpty()) << node->log.join(QLatin1Char(',')).toStdString();
 }
 
-TEST_F(Zel_MemorySessionTest, EveryExceptionOfTheWorkIsAnsweredWithOneFailureAndTheEnd)
+TEST_P(Zel_MemorySessionTest, EveryExceptionOfTheWorkIsAnsweredWithOneFailureAndTheEnd)
 {
     // Whatever the server's work throws, the callback hears exactly one
     // failure (Internal, naming the exception where it has a text) and then

@@ -89,14 +89,30 @@ char threadState(long tid)
     return close == std::string::npos || close + 2 >= text.size() ? 0 : text[close + 2];
 }
 
+// The threaded tests of the server rules, once per kind of store.
+class Zel_MemorySessionStoreThreadTest : public ::testing::TestWithParam<StoreKind>
+{
+protected:
+    std::unique_ptr<StoreUnderTest> loadSample()
+    {
+        QString error;
+        std::unique_ptr<StoreUnderTest> store = GetParam().load(Zel_MemoryTree::sampleJson(), &error);
+        EXPECT_TRUE(store) << error.toStdString();
+        return store;
+    }
+};
+
 } // namespace
 
-TEST(Zel_MemorySessionThreadTest, ManyRequestsOfTwoSessionsInFlightLoseNothing)
+INSTANTIATE_TEST_SUITE_P(Store, Zel_MemorySessionStoreThreadTest, ::testing::ValuesIn(storeKinds()), StoreKindName());
+
+TEST_P(Zel_MemorySessionStoreThreadTest, ManyRequestsOfTwoSessionsInFlightLoseNothing)
 {
     Orv_Engine engine(4);
-    boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
-    boost::shared_ptr<Zel_MemorySession> editor(new Zel_MemorySession(tree, &engine));
-    boost::shared_ptr<Zel_MemorySession> producer(new Zel_MemorySession(tree, &engine));
+    const std::unique_ptr<StoreUnderTest> store = loadSample();
+    ASSERT_TRUE(store);
+    boost::shared_ptr<Zel_MemorySession> editor = store->newSession(&engine, QStringLiteral("zel"));
+    boost::shared_ptr<Zel_MemorySession> producer = store->newSession(&engine, QStringLiteral("zel"));
     auto login1 = rec<LoginRec>();
     auto login2 = rec<LoginRec>();
     editor->submitRequest(editor->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login1));
@@ -174,13 +190,14 @@ TEST(Zel_MemorySessionThreadTest, ManyRequestsOfTwoSessionsInFlightLoseNothing)
     EXPECT_EQ(0u, engine.failedRequestCount());
 }
 
-TEST(Zel_MemorySessionThreadTest, SessionDestroyedWhileItsRequestsRunFailsThemCleanly)
+TEST_P(Zel_MemorySessionStoreThreadTest, SessionDestroyedWhileItsRequestsRunFailsThemCleanly)
 {
     Orv_Engine engine(4);
-    boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    const std::unique_ptr<StoreUnderTest> store = loadSample();
+    ASSERT_TRUE(store);
     std::vector<boost::shared_ptr<NodeRec>> answers;
     {
-        boost::shared_ptr<Zel_MemorySession> s(new Zel_MemorySession(tree, &engine));
+        boost::shared_ptr<Zel_MemorySession> s = store->newSession(&engine, QStringLiteral("zel"));
         auto login = rec<LoginRec>();
         s->submitRequest(s->makeLoginReqSP(QStringLiteral("editor"), QStringLiteral("editor"), {}, login));
         engine.DeliverAll();

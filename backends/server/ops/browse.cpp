@@ -1,6 +1,6 @@
 // Operations that read the tree: nodes, children, paths, properties,
 // permissions, reservations, frame locators and restrictions, search.
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_AssociationsRes.h"
 #include "Zel_ChildrenAtCB.h"
@@ -55,20 +55,19 @@ std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node
     // in node order by keys read once per snapshot (Zel_NodeList::sortByOrder).
     // Where the answer releases its snapshots in order, it gets them in the
     // order taken.
-    const SnapshotContext context = childContext(work.tree, &parent, work.user);
-    const std::size_t count = static_cast<std::size_t>(parent.children.size());
+    const SnapshotContext context = childContext(work.txn, &parent, work.user);
+    const std::size_t count = static_cast<std::size_t>(work.txn.childCount(parent));
     std::vector<boost::shared_ptr<Zel_Node>> children;
     children.reserve(count);
     if (work.releasedInOrder)
         work.releasedInOrder->reserve(work.releasedInOrder->size() + count);
-    for (const QString& id : parent.children) {
-        const Node* child = work.tree.byId(id);
-        if (child && (work.tree.permissionsBelow(work.user, *child, context.permissions) & PermRead)) {
-            children.push_back(work.snapshot(*child, context));
+    work.txn.forEachChild(parent, [&](const Node& child) {
+        if (permissionsBelow(context.account, child, context.permissions) & PermRead) {
+            children.push_back(work.snapshot(child, context));
             if (work.releasedInOrder)
                 work.releasedInOrder->push_back(children.back());
         }
-    }
+    });
     Zel_NodeList::sortByOrder(children);
     return children;
 }
@@ -128,10 +127,10 @@ Zel_NodePermissions permissionsObject(const QString& moniker, std::uint32_t bits
 
 // The project (or other container) at or above the node that carries a
 // synced project GUID, or null.
-const Node* syncedProjectOf(const Tree& tree, const Node& node)
+const Node* syncedProjectOf(ReadTxn& txn, const Node& node)
 {
-    for (const Node* n = &node; n; n = tree.parentOf(*n)) {
-        if (!tree.propertyValue(*n, QStringLiteral("SyncedProject_GUID")).isEmpty())
+    for (const Node* n = &node; n; n = parentOf(txn, *n)) {
+        if (!propertyValue(*n, QStringLiteral("SyncedProject_GUID")).isEmpty())
             return n;
     }
     return nullptr;
@@ -142,14 +141,14 @@ bool containsText(const QString& haystack, const QString& needle)
     return haystack.contains(needle, Qt::CaseInsensitive);
 }
 
-bool matchesQuery(const Tree& tree, const Node& node, const Zel_QuerySpec& query)
+bool matchesQuery(ReadTxn& txn, const Node& node, const Zel_QuerySpec& query)
 {
-    if (node.id == tree.rootId)
+    if (node.parentId.isEmpty()) // the root
         return false;
     if (!query.getSelectedTypes().isEmpty() && !query.getSelectedTypes().contains(node.mimeType))
         return false;
     if (!query.getCategories().isEmpty()) {
-        const QStringList categories = tree.propertyValue(node, QStringLiteral("Category")).split(QLatin1Char(';'), Qt::SkipEmptyParts);
+        const QStringList categories = propertyValue(node, QStringLiteral("Category")).split(QLatin1Char(';'), Qt::SkipEmptyParts);
         bool any = false;
         for (const QString& category : query.getCategories())
             any = any || categories.contains(category, Qt::CaseInsensitive);
@@ -157,12 +156,12 @@ bool matchesQuery(const Tree& tree, const Node& node, const Zel_QuerySpec& query
             return false;
     }
     for (const Zel_Property& condition : query.getProperties()) {
-        if (!containsText(tree.propertyValue(node, condition.key()), condition.value()))
+        if (!containsText(propertyValue(node, condition.key()), condition.value()))
             return false;
     }
     if (query.getTimeParamAsSeconds() > 0) {
         const QDateTime changed = node.modified.isValid() ? node.modified : node.created;
-        if (!changed.isValid() || changed.secsTo(QDateTime::currentDateTimeUtc()) > query.getTimeParamAsSeconds())
+        if (!changed.isValid() || changed.secsTo(txn.now()) > query.getTimeParamAsSeconds())
             return false;
     }
     const QString text = query.getTextParam();
@@ -171,7 +170,7 @@ bool matchesQuery(const Tree& tree, const Node& node, const Zel_QuerySpec& query
     if (containsText(node.name, text))
         return true;
     for (const Property& p : node.properties) {
-        const KeyDesc* key = tree.key(p.key);
+        const KeyDesc* key = txn.key(p.key);
         if ((!key || key->textSearchable) && containsText(p.value, text))
             return true;
     }
@@ -197,8 +196,7 @@ bool matchesQuery(const Tree& tree, const Node& node, const Zel_QuerySpec& query
 
 void RootNodeOp::run(Work& work, const Args&, Result& result)
 {
-    ReadHold hold(work.tree);
-    const Node* root = work.tree.byId(work.tree.rootId);
+    const Node* root = work.txn.root();
     if (!root)
         fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("The tree has no root."));
     work.require(*root, PermRead, QStringLiteral("read"));
@@ -208,38 +206,33 @@ ZEL_MEMORY_EXECUTE(RootNodeOp)
 
 void GetNodeOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     result.setResult(work.snapshot(work.node(args.moniker)), ok());
 }
 ZEL_MEMORY_EXECUTE(GetNodeOp)
 
 void RefreshNodeOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     result.succeed(work.snapshot(work.node(args.moniker)));
 }
 ZEL_MEMORY_EXECUTE(RefreshNodeOp)
 
 void NodeOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     result.succeed(work.snapshot(work.nodeAtPath(args.path, args.path.isRooted())));
 }
 ZEL_MEMORY_EXECUTE(NodeOp)
 
 void MonikerOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     result.succeed(sharedText(work.nodeAtPath(args.path, args.path.isRooted()).moniker));
 }
 ZEL_MEMORY_EXECUTE(MonikerOp)
 
 void DirOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     boost::shared_ptr<Zel_Directory> dir(
-        new Zel_Directory(QLatin1Char('/') + work.tree.pathOf(node).join(QLatin1Char('/')), QStringLiteral("/")));
+        new Zel_Directory(QLatin1Char('/') + pathOf(work.txn, node).join(QLatin1Char('/')), QStringLiteral("/")));
     result.succeed(dir);
 }
 ZEL_MEMORY_EXECUTE(DirOp)
@@ -248,7 +241,6 @@ ZEL_MEMORY_EXECUTE(DirOp)
 
 void GetChildrenOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
     // One "no error" record serves every answer: it never reaches a handler.
@@ -262,7 +254,6 @@ ZEL_MEMORY_EXECUTE(GetChildrenOp)
 
 void ChildrenOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
     // Each child with its has-children flag.
@@ -278,7 +269,6 @@ ZEL_MEMORY_EXECUTE(ChildrenOp)
 
 void ChildrenAtOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& parent = work.nodeAtPath(args.path, args.path.isRooted());
     work.requireFolder(parent);
     for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
@@ -295,11 +285,13 @@ void ChildrenAtMonikerOp::prepare(const boost::shared_ptr<Callback>& callback, A
 
 void ChildrenAtMonikerOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& parent = work.node(args.moniker);
     work.requireFolder(parent);
-    if (args.callback)
-        args.callback->setParentNode(work.snapshot(parent));
+    if (args.callback) {
+        const boost::shared_ptr<Zel_ChildrenAtMonikerCB> callback = args.callback;
+        const boost::shared_ptr<Zel_Node> snapshot = work.snapshot(parent);
+        work.txn.onCommit([callback, snapshot] { callback->setParentNode(snapshot); });
+    }
     for (const boost::shared_ptr<Zel_Node>& child : readableChildren(work, parent))
         result.succeed(child);
 }
@@ -307,15 +299,14 @@ ZEL_MEMORY_EXECUTE(ChildrenAtMonikerOp)
 
 void GetLinkedProjectsOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     // The linked projects other than the one the node belongs to.
     const Node* own = &node;
     while (own && own->mimeType != QLatin1String("project"))
-        own = work.tree.parentOf(*own);
-    for (const QString& moniker : work.tree.linkedProjects) {
-        const Node* project = work.tree.byMoniker(moniker);
-        if (project && project != own && (work.tree.permissionsOf(work.user, *project) & PermRead))
+        own = parentOf(work.txn, *own);
+    for (const QString& moniker : work.txn.linkedProjects()) {
+        const Node* project = work.txn.nodeByMoniker(moniker);
+        if (project && project != own && (work.permissions(*project) & PermRead))
             result.setResult(work.snapshot(*project), ok());
     }
 }
@@ -323,9 +314,8 @@ ZEL_MEMORY_EXECUTE(GetLinkedProjectsOp)
 
 void GetSyncedProjRootOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
-    const Node* root = syncedProjectOf(work.tree, node);
+    const Node* root = syncedProjectOf(work.txn, node);
     if (!root)
         fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("%1 is not in a synced project.").arg(work.describe(node)));
     result.setResult(work.snapshot(*root), ok());
@@ -334,7 +324,6 @@ ZEL_MEMORY_EXECUTE(GetSyncedProjRootOp)
 
 void AssociationsOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     // The directories that hold the node's media files, each once.
     QStringList seen;
@@ -362,12 +351,12 @@ void QueryOp::run(Work& work, const Args& args, Result& result)
     if (query.getTextParam().isEmpty() && query.getSelectedTypes().isEmpty() && query.getCategories().isEmpty()
         && query.getProperties().isEmpty() && query.getTimeParamAsSeconds() <= 0)
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("The query is empty: give a text, types, categories, properties or a time."));
-    ReadHold hold(work.tree);
     QList<boost::shared_ptr<Zel_Node>> found;
-    for (const auto& entry : work.tree.nodes) {
-        const Node& node = entry.second;
-        if ((work.tree.permissionsOf(work.user, node) & PermRead) && matchesQuery(work.tree, node, query))
-            found.append(work.snapshot(node));
+    std::vector<const Node*> nodes;
+    work.txn.allNodes(nodes);
+    for (const Node* node : nodes) {
+        if ((work.permissions(*node) & PermRead) && matchesQuery(work.txn, *node, query))
+            found.append(work.snapshot(*node));
     }
     Zel_NodeList::sortByOrder(found);
     for (const boost::shared_ptr<Zel_Node>& node : found)
@@ -379,16 +368,14 @@ ZEL_MEMORY_EXECUTE(QueryOp)
 
 void PropertyListOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
-    result.succeed(nodeProperties(work.tree, work.node(args.moniker)));
+    result.succeed(nodeProperties(work.txn, work.node(args.moniker)));
 }
 ZEL_MEMORY_EXECUTE(PropertyListOp)
 
 void GetPropertiesOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
-    const Zel_PropertyList all = nodeProperties(work.tree, node);
+    const Zel_PropertyList all = nodeProperties(work.txn, node);
     if (args.keys.isEmpty()) {
         result.succeed(all);
         return;
@@ -398,7 +385,7 @@ void GetPropertiesOp::run(Work& work, const Args& args, Result& result)
         const Zel_Property property = all.findByKey(key);
         if (!property.key().isNull())
             chosen.addIfKeyNotInList(property);
-        else if (!work.tree.key(key))
+        else if (!work.txn.key(key))
             fail(Zel_MemoryErrorCodes::UnknownProperty, QStringLiteral("The server knows no property \"%1\".").arg(key));
         else
             chosen.addIfKeyNotInList(Zel_Property(key, QString(), QString()));
@@ -409,9 +396,8 @@ ZEL_MEMORY_EXECUTE(GetPropertiesOp)
 
 void MediaResolutionsOp::run(Work& work, const Args&, Result& result)
 {
-    ReadHold hold(work.tree);
     Zel_PropertyKeyInfoList list;
-    for (const Resolution& r : work.tree.resolutions)
+    for (const Resolution& r : work.txn.resolutions())
         list.addIfKeyNotInList(Zel_PropertyKeyInfo(r.id, r.label, false, true, r.label,
                                                    static_cast<Zel_PropertyKeyType>(r.type), false, false));
     result.setResult(list, ok());
@@ -420,13 +406,13 @@ ZEL_MEMORY_EXECUTE(MediaResolutionsOp)
 
 void NodeResolutionsOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     work.requireMedia(node);
     // One answer per media file: the media object and the resolution's label.
+    const QList<Resolution> resolutions = work.txn.resolutions();
     for (const Media& media : node.media) {
         QString label = media.resolution;
-        for (const Resolution& r : work.tree.resolutions) {
+        for (const Resolution& r : resolutions) {
             if (r.id == media.resolution)
                 label = r.label;
         }
@@ -439,35 +425,32 @@ ZEL_MEMORY_EXECUTE(NodeResolutionsOp)
 
 void NodePermissionsOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     result.setResult(boost::shared_ptr<Zel_NodePermissions>(new Zel_NodePermissions(
-                         permissionsObject(node.moniker, work.tree.permissionsOf(work.user, node)))),
+                         permissionsObject(node.moniker, work.permissions(node)))),
                      ok());
 }
 ZEL_MEMORY_EXECUTE(NodePermissionsOp)
 
 void GetUserPriviledgesOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
-    if (!work.tree.user(args.user))
+    if (!work.txn.user(args.user))
         fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("The server knows no user \"%1\".").arg(args.user));
     if (args.user != work.user)
         work.require(node, PermPermissionsManagement, QStringLiteral("read the privileges of other users on"));
     result.setResult(boost::shared_ptr<Zel_NodePermissions>(new Zel_NodePermissions(
-                         permissionsObject(node.moniker, work.tree.permissionsOf(args.user, node)))),
+                         permissionsObject(node.moniker, permissionsOf(work.txn, args.user, node)))),
                      ok());
 }
 ZEL_MEMORY_EXECUTE(GetUserPriviledgesOp)
 
 void GetReservationsOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     // The holder and the end of the node's reservation; no answer when free
     // (never reserved, released, or expired).
-    if (node.reservation.isActive())
+    if (isReserved(work.txn, node.reservation))
         result.setResult(node.reservation.user, node.reservation.until, ok());
 }
 ZEL_MEMORY_EXECUTE(GetReservationsOp)
@@ -476,7 +459,6 @@ ZEL_MEMORY_EXECUTE(GetReservationsOp)
 
 void GetFrameLocatorListOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     work.requireMedia(node);
     result.succeed(markersOf(node, false));
@@ -485,7 +467,6 @@ ZEL_MEMORY_EXECUTE(GetFrameLocatorListOp)
 
 void GetFrameRestrictionListOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.node(args.moniker);
     work.requireMedia(node);
     result.succeed(markersOf(node, true));

@@ -1,6 +1,6 @@
 // Operations on media objects: analysis, check-in, check-in update, and the
 // lookups by MobID (node, binary form, head frame).
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_AnalyzeCB.h"
 #include "Zel_CheckinRes.h"
@@ -33,19 +33,20 @@ QString mediaFileOf(const Zel_MobDesc& desc)
     return desc.getOMF2FilePath();
 }
 
-QString defaultResolution(const Tree& tree)
+QString defaultResolution(ReadTxn& txn)
 {
-    for (const auto& setting : tree.workgroupSettings) {
+    for (const auto& setting : txn.workgroupSettings()) {
         if (setting.first == QLatin1String("Media.DefaultResolution"))
             return setting.second;
     }
-    return tree.resolutions.isEmpty() ? QString() : tree.resolutions.first().id;
+    const QList<Resolution> resolutions = txn.resolutions();
+    return resolutions.isEmpty() ? QString() : resolutions.first().id;
 }
 
 // A small head frame: a 16x9 binary PPM in the clip's colour.
-QByteArray headFrame(const Tree& tree, const Node& node)
+QByteArray headFrame(const Node& node)
 {
-    int rgb = Zel_Node::colorFromName(tree.propertyValue(node, QStringLiteral("Color")).toLatin1().constData());
+    int rgb = Zel_Node::colorFromName(propertyValue(node, QStringLiteral("Color")).toLatin1().constData());
     if (rgb < 0)
         rgb = 0x808080;
     QByteArray image("P6\n16 9\n255\n");
@@ -68,7 +69,6 @@ void AnalyzeOp::run(Work& work, const Args& args, Result& result)
 {
     if (args.files.isEmpty())
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media files to analyse were given."));
-    WriteHold hold(work.tree); // new MobIDs come from the tree's counter
     // One answer per file: a descriptor ready for check-in, or why not.
     for (const QString& file : args.files) {
         const QFileInfo info(file);
@@ -77,7 +77,7 @@ void AnalyzeOp::run(Work& work, const Args& args, Result& result)
                                               QStringLiteral("\"%1\" is not a media file this server can check in.").arg(file)));
             continue;
         }
-        boost::shared_ptr<Zel_MobDesc> desc(new Zel_MobDesc(work.tree.newMobId(), file, QString()));
+        boost::shared_ptr<Zel_MobDesc> desc(new Zel_MobDesc(newMobId(), file, QString()));
         if (info.suffix().compare(QLatin1String("omf"), Qt::CaseInsensitive) == 0) {
             desc->setAAFFilePath(QString());
             desc->setOMF2FilePath(file);
@@ -88,17 +88,16 @@ void AnalyzeOp::run(Work& work, const Args& args, Result& result)
 }
 ZEL_MEMORY_EXECUTE(AnalyzeOp)
 
-void CheckinOp::run(Work& work, const Args& args, Result& result)
+void CheckinOp::run(WriteWork& work, const Args& args, Result& result)
 {
-    WriteHold hold(work.tree);
-    Node& folder = work.node(args.folder);
+    const Node& folder = work.node(args.folder);
     work.requireFolder(folder);
     work.require(folder, PermAddFiles, QStringLiteral("check media in to"));
     work.requireNotReservedByOther(folder, QStringLiteral("check media in to"), false);
     if (args.mobs.size() == 0)
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media objects to check in were given."));
     requireDepth(work, folder, 0);
-    const QString resolution = defaultResolution(work.tree);
+    const QString resolution = defaultResolution(work.txn);
     // One answer per media object; one that cannot be checked in is reported
     // and the others go on.
     for (unsigned long long i = 0; i < args.mobs.size(); ++i) {
@@ -110,8 +109,8 @@ void CheckinOp::run(Work& work, const Args& args, Result& result)
             continue;
         }
         const QString file = mediaFileOf(*desc);
-        QString mobID = desc->getMobID().isEmpty() ? work.tree.newMobId() : desc->getMobID();
-        if (work.tree.byMobId(mobID)) {
+        QString mobID = desc->getMobID().isEmpty() ? newMobId() : desc->getMobID();
+        if (work.txn.nodeByMobId(mobID)) {
             result.addItem(desc, boost::shared_ptr<Zel_Node>(), boost::shared_ptr<QString>(),
                            Zel_MemoryError::make(Zel_MemoryErrorCodes::InvalidMedia,
                                                  QStringLiteral("Media object \"%1\" is checked in already; update it instead.").arg(mobID)));
@@ -121,27 +120,24 @@ void CheckinOp::run(Work& work, const Args& args, Result& result)
         if (name.isEmpty() || name.size() > MaxNameLength || !work.session.isValidAssetName(name))
             name = QStringLiteral("Clip ") + mobID.right(8);
         Node node;
-        node.id = work.tree.newNodeId();
-        node.moniker = monikerOfId(node.id);
-        node.name = work.tree.uniqueChildName(folder, name);
+        node.name = uniqueChildName(work.txn, folder, name);
         node.mimeType = QStringLiteral("masterclip");
         node.mobId = mobID;
-        node.created = node.modified = QDateTime::currentDateTimeUtc();
+        node.created = node.modified = work.txn.now();
         node.properties.append(Property{QStringLiteral("Created By"), work.user, QString()});
         if (!file.isEmpty())
             node.media.append(Media{file, resolution});
-        Node& created = work.tree.insertNode(std::move(node), folder);
-        hold.added(folder.moniker, created.moniker);
+        const Node& created = work.write.insertNode(std::move(node), folder);
+        work.write.reportAdded(folder.moniker, created.moniker);
         result.addItem(desc, work.snapshot(created),
                        sharedText(QStringLiteral("checked in as \"%1\"").arg(created.name)), ok());
     }
 }
 ZEL_MEMORY_EXECUTE(CheckinOp)
 
-void CheckinLocalBinOp::run(Work& work, const Args& args, Result& result)
+void CheckinLocalBinOp::run(WriteWork& work, const Args& args, Result& result)
 {
-    WriteHold hold(work.tree);
-    Node& folder = work.node(args.folder);
+    const Node& folder = work.node(args.folder);
     work.requireFolder(folder);
     if (args.binFile.isEmpty())
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No bin file was given."));
@@ -152,53 +148,53 @@ void CheckinLocalBinOp::run(Work& work, const Args& args, Result& result)
     requireDepth(work, folder, 0);
     // The bin arrives as a new bin of the folder, named after the file.
     Node bin;
-    bin.id = work.tree.newNodeId();
-    bin.moniker = monikerOfId(bin.id);
-    bin.name = work.tree.uniqueChildName(folder, name);
+    bin.name = uniqueChildName(work.txn, folder, name);
     bin.mimeType = QStringLiteral("bin");
-    bin.created = bin.modified = QDateTime::currentDateTimeUtc();
+    bin.created = bin.modified = work.txn.now();
     bin.properties.append(Property{QStringLiteral("Created By"), work.user, QString()});
-    Node& created = work.tree.insertNode(std::move(bin), folder);
-    hold.added(folder.moniker, created.moniker);
+    const Node& created = work.write.insertNode(std::move(bin), folder);
+    work.write.reportAdded(folder.moniker, created.moniker);
     boost::shared_ptr<Zel_MobDesc> desc(new Zel_MobDesc(QString(), args.binFile, QString()));
     result.addItem(desc, work.snapshot(created), sharedText(QStringLiteral("checked in bin \"%1\"").arg(created.name)), ok());
 }
 ZEL_MEMORY_EXECUTE(CheckinLocalBinOp)
 
-void CheckinUpdateOp::run(Work& work, const Args& args, Result& result)
+void CheckinUpdateOp::run(WriteWork& work, const Args& args, Result& result)
 {
     if (args.mobs.size() == 0)
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media objects to update were given."));
-    WriteHold hold(work.tree);
     for (unsigned long long i = 0; i < args.mobs.size(); ++i) {
         boost::shared_ptr<Zel_MobDesc> desc = args.mobs.getMobDesc(i);
+        const WriteTxn::Savepoint point = work.write.savepoint();
         try {
             if (!desc)
                 fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("Media object %1 is empty.").arg(i + 1));
-            Node& node = work.nodeOfMob(desc->getMobID());
+            const Node& node = work.nodeOfMob(desc->getMobID());
             work.require(node, PermWriteNewVersions, QStringLiteral("update the media of"));
             work.requireNotReservedByOther(node, QStringLiteral("update"), false);
             const QString file = mediaFileOf(*desc);
+            const QString resolution = file.isEmpty() || !node.media.isEmpty() ? QString() : defaultResolution(work.txn);
+            Node& record = work.write.edit(node);
             if (!file.isEmpty()) {
-                if (node.media.isEmpty())
-                    node.media.append(Media{file, defaultResolution(work.tree)});
+                if (record.media.isEmpty())
+                    record.media.append(Media{file, resolution});
                 else
-                    node.media.first().path = file;
+                    record.media.first().path = file;
             }
             bool versioned = false;
-            for (Property& p : node.properties) {
+            for (Property& p : record.properties) {
                 if (p.key == QLatin1String("VersionNumber")) {
                     p.value = QString::number(p.value.toInt() + 1);
                     versioned = true;
                 }
             }
             if (!versioned)
-                node.properties.append(Property{QStringLiteral("VersionNumber"), QStringLiteral("2"), QString()});
-            node.modified = QDateTime::currentDateTimeUtc();
-            if (const Node* parent = work.tree.parentOf(node))
-                hold.updated(parent->moniker, node.moniker);
+                record.properties.append(Property{QStringLiteral("VersionNumber"), QStringLiteral("2"), QString()});
+            record.modified = work.txn.now();
+            reportUpdated(work, node);
             result.addItem(ok());
         } catch (const Failure& failure) {
+            work.write.rollbackTo(point);
             result.addItem(failure.error);
         }
     }
@@ -207,16 +203,14 @@ ZEL_MEMORY_EXECUTE(CheckinUpdateOp)
 
 void MobNodeOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     result.succeed(work.snapshot(work.nodeOfMob(args.mob ? args.mob->toZelString() : QString())));
 }
 ZEL_MEMORY_EXECUTE(MobNodeOp)
 
 void MobBinaryOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.nodeOfMob(args.mob ? args.mob->toZelString() : QString());
-    result.succeed(mobOf(node.mobId), nodeJson(work.tree, node));
+    result.succeed(mobOf(node.mobId), nodeJson(work.txn, node));
 }
 ZEL_MEMORY_EXECUTE(MobBinaryOp)
 
@@ -224,12 +218,11 @@ void MobBinaryDnDOp::run(Work& work, const Args& args, Result& result)
 {
     if (args.mobs.size() == 0)
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media objects were given."));
-    ReadHold hold(work.tree);
     for (unsigned long long i = 0; i < args.mobs.size(); ++i) {
         const boost::shared_ptr<Zel_MobID> mob = args.mobs.getMobID(i);
         try {
             const Node& node = work.nodeOfMob(mob ? mob->toZelString() : QString());
-            result.succeed(mobOf(node.mobId), nodeJson(work.tree, node));
+            result.succeed(mobOf(node.mobId), nodeJson(work.txn, node));
         } catch (const Failure& failure) {
             result.fail(failure.error);
         }
@@ -239,10 +232,9 @@ ZEL_MEMORY_EXECUTE(MobBinaryDnDOp)
 
 void MobHeadframeOp::run(Work& work, const Args& args, Result& result)
 {
-    ReadHold hold(work.tree);
     const Node& node = work.nodeOfMob(args.mob ? args.mob->toZelString() : QString());
     work.requireMedia(node);
-    result.succeed(mobOf(node.mobId), headFrame(work.tree, node));
+    result.succeed(mobOf(node.mobId), headFrame(node));
 }
 ZEL_MEMORY_EXECUTE(MobHeadframeOp)
 

@@ -1,5 +1,5 @@
 // A failure as the only answer of each library result class.
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_AddDependencyRes.h"
 #include "Zel_AssociationsRes.h"

@@ -1,7 +1,7 @@
 // Operations of the session: login, start-up, and the settings the server
 // stores for users, applications and the workgroup, exchanged as XML text in
 // the form of Zel_SettingList::toXML.
-#include "memory_ops_p.h"
+#include "ops_p.h"
 
 #include "Zel_GetApplicationSettingsRes.h"
 #include "Zel_GetSettingsCB.h"
@@ -147,17 +147,15 @@ void requireName(const QString& name, const QString& what)
 
 void LoginOp::run(Work& work, const Args& args, Result& result)
 {
-    QString name;
-    {
-        ReadHold hold(work.tree);
-        const User* user = work.tree.user(args.user);
-        // One message for both faults: a login does not tell which names exist.
-        if (!user || user->password != args.password)
-            fail(Zel_MemoryErrorCodes::LoginFailed, QStringLiteral("Login failed: unknown user or wrong password."));
-        name = user->name;
-    }
+    const User* user = work.txn.user(args.user);
+    // One message for both faults: a login does not tell which names exist.
+    if (!user || user->password != args.password)
+        fail(Zel_MemoryErrorCodes::LoginFailed, QStringLiteral("Login failed: unknown user or wrong password."));
+    const QString name = user->name;
     const QString sessionID = QUuid::createUuid().toString().remove(QLatin1Char('{')).remove(QLatin1Char('}'));
-    work.session.setLogin(name, sessionID, QDateTime::currentDateTimeUtc());
+    SessionState& session = work.session;
+    const QDateTime time = work.txn.now();
+    work.txn.onCommit([&session, name, sessionID, time] { session.setLogin(name, sessionID, time); });
     result.succeed(name);
 }
 ZEL_MEMORY_EXECUTE(LoginOp)
@@ -172,17 +170,15 @@ ZEL_MEMORY_EXECUTE(StartupOp)
 void GetApplicationSettingsOp::run(Work& work, const Args& args, Result& result)
 {
     requireName(args.application, QStringLiteral("application name"));
-    ReadHold hold(work.tree);
-    result.setResult(settingsXml(work.tree.applicationSettings.value(args.application), QStringLiteral("ApplicationSettings")), ok());
+    result.setResult(settingsXml(work.txn.applicationSettings(args.application), QStringLiteral("ApplicationSettings")), ok());
 }
 ZEL_MEMORY_EXECUTE(GetApplicationSettingsOp)
 
-void SetApplicationSettingsOp::run(Work& work, const Args& args, Result& result)
+void SetApplicationSettingsOp::run(WriteWork& work, const Args& args, Result& result)
 {
     requireName(args.application, QStringLiteral("application name"));
     const SettingPairs pairs = settingsFromXml(args.xml);
-    WriteHold hold(work.tree);
-    work.tree.applicationSettings.insert(args.application, pairs);
+    work.write.setApplicationSettings(args.application, pairs);
     result.setResult(ok());
 }
 ZEL_MEMORY_EXECUTE(SetApplicationSettingsOp)
@@ -190,46 +186,41 @@ ZEL_MEMORY_EXECUTE(SetApplicationSettingsOp)
 void GetUserSettingsOp::run(Work& work, const Args& args, Result& result)
 {
     requireType(args.type);
-    ReadHold hold(work.tree);
-    const SettingPairs pairs = work.tree.userSettings.value(work.user).value(static_cast<int>(args.type));
+    const SettingPairs pairs = work.txn.userSettings(work.user, static_cast<int>(args.type));
     result.setResult(args.type, settingsXml(pairs, QStringLiteral("UserSettings")), ok());
 }
 ZEL_MEMORY_EXECUTE(GetUserSettingsOp)
 
-void SetUserSettingsOp::run(Work& work, const Args& args, Result& result)
+void SetUserSettingsOp::run(WriteWork& work, const Args& args, Result& result)
 {
     requireType(args.type);
     const SettingPairs pairs = settingsFromXml(args.xml);
-    WriteHold hold(work.tree);
-    work.tree.userSettings[work.user].insert(static_cast<int>(args.type), pairs);
+    work.write.setUserSettings(work.user, static_cast<int>(args.type), pairs);
     result.setResult(ok());
 }
 ZEL_MEMORY_EXECUTE(SetUserSettingsOp)
 
 void GetWorkgroupSettingsOp::run(Work& work, const Args&, Result& result)
 {
-    ReadHold hold(work.tree);
-    result.setResult(settingsXml(work.tree.workgroupSettings, QStringLiteral("WorkgroupSettings")), ok());
+    result.setResult(settingsXml(work.txn.workgroupSettings(), QStringLiteral("WorkgroupSettings")), ok());
 }
 ZEL_MEMORY_EXECUTE(GetWorkgroupSettingsOp)
 
 void GetSettingsOp::run(Work& work, const Args& args, Result& result)
 {
     requireName(args.name, QStringLiteral("settings name"));
-    ReadHold hold(work.tree);
-    auto it = work.tree.documents.constFind(args.name);
-    if (it == work.tree.documents.constEnd())
+    QString xml;
+    if (!work.txn.document(args.name, xml))
         fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("No settings are stored under the name \"%1\".").arg(args.name));
-    result.succeed(it.value());
+    result.succeed(xml);
 }
 ZEL_MEMORY_EXECUTE(GetSettingsOp)
 
-void SaveSettingsOp::run(Work& work, const Args& args, Result& result)
+void SaveSettingsOp::run(WriteWork& work, const Args& args, Result& result)
 {
     requireName(args.name, QStringLiteral("settings name"));
     settingsFromXml(args.xml); // well-formed, or the request fails
-    WriteHold hold(work.tree);
-    work.tree.documents.insert(args.name, args.xml);
+    work.write.setDocument(args.name, args.xml);
     result.succeed();
 }
 ZEL_MEMORY_EXECUTE(SaveSettingsOp)

@@ -5,8 +5,8 @@
 // and the predicates reflect the tree as the request saw it, so a node never
 // changes under the application's feet. Properties are the exception the
 // interface provides for: decacheProperties() drops them, and the next
-// getProperties() or getPropertyValue() reads them afresh from the tree (if
-// the node still exists there).
+// getProperties() or getPropertyValue() reads them afresh from the store the
+// node came from (if the node still exists there).
 //
 // getProperties() lists "Name", "Mime Type" and "MobID" (media only), then the
 // stored properties, then "Locked By" and "Locked On" while the node is
@@ -28,7 +28,9 @@
 
 #include <mutex>
 
-class Zel_MemoryTree;
+namespace ZelMemory {
+class Store;
+}
 
 class ZEL_MEMORY_EXPORT Zel_MemoryNode : public Zel_Node
 {
@@ -53,9 +55,9 @@ public:
         Zel_PropertyList properties;
     };
 
-    Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree);
+    Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr<ZelMemory::Store>& store);
     // The same, taking the snapshot over.
-    Zel_MemoryNode(Snapshot&& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree);
+    Zel_MemoryNode(Snapshot&& snapshot, const boost::shared_ptr<ZelMemory::Store>& store);
     virtual ~Zel_MemoryNode();
 
     virtual bool isReserved() const override;
@@ -83,7 +85,7 @@ private:
     Zel_PropertyList cachedProperties();
 
     const Snapshot mSnapshot;
-    const boost::weak_ptr<Zel_MemoryTree> mTree;
+    const boost::weak_ptr<ZelMemory::Store> mStore;
     mutable std::mutex mCacheMutex;
     Zel_PropertyList mProperties;
     bool mPropertiesStale = false;

@@ -1,16 +1,15 @@
 #include "Zel_MemoryNode.h"
 
-#include "memory_tree_p.h"
-#include "Zel_MemoryTree.h"
+#include "rules_p.h"
 
 #include "Zel_MimeTypeSpec.h"
 
 #include <utility>
 
-Zel_MemoryNode::Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree)
+Zel_MemoryNode::Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr<ZelMemory::Store>& store)
     : Zel_Node(snapshot.nodeID)
     , mSnapshot(snapshot)
-    , mTree(tree)
+    , mStore(store)
     , mProperties(snapshot.properties)
 {
     setMoniker(snapshot.moniker);
@@ -20,10 +19,10 @@ Zel_MemoryNode::Zel_MemoryNode(const Snapshot& snapshot, const boost::shared_ptr
     setValid(true);
 }
 
-Zel_MemoryNode::Zel_MemoryNode(Snapshot&& snapshot, const boost::shared_ptr<Zel_MemoryTree>& tree)
+Zel_MemoryNode::Zel_MemoryNode(Snapshot&& snapshot, const boost::shared_ptr<ZelMemory::Store>& store)
     : Zel_Node(snapshot.nodeID)
     , mSnapshot(std::move(snapshot))
-    , mTree(tree)
+    , mStore(store)
     , mProperties(mSnapshot.properties)
 {
     setMoniker(mSnapshot.moniker);
@@ -125,13 +124,13 @@ Zel_PropertyList Zel_MemoryNode::cachedProperties()
     // Read afresh without holding the cache lock while the tree is locked.
     Zel_PropertyList fresh;
     bool found = false;
-    if (boost::shared_ptr<Zel_MemoryTree> tree = mTree.lock()) {
-        ZelMemory::Tree& data = tree->data();
-        ZelMemory::ReadHold hold(data);
-        if (const ZelMemory::Node* node = data.byMoniker(mSnapshot.moniker)) {
-            fresh = ZelMemory::nodeProperties(data, *node);
+    if (boost::shared_ptr<ZelMemory::Store> store = mStore.lock()) {
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = store->beginRead();
+        if (const ZelMemory::Node* node = txn->nodeByMoniker(mSnapshot.moniker)) {
+            fresh = ZelMemory::nodeProperties(*txn, *node);
             found = true;
         }
+        txn->commit();
     }
     std::lock_guard<std::mutex> lock(mCacheMutex);
     if (found) {

@@ -1,6 +1,6 @@
 #include "Zel_MemoryTree.h"
 
-#include "memory_session_p.h"
+#include "session_p.h"
 #include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 
@@ -120,17 +120,17 @@ QList<boost::shared_ptr<Zel_Node>> Zel_MemoryTree::childSnapshots(const boost::s
                                                                   const QString& parentMoniker, const QString& user)
 {
     QList<boost::shared_ptr<Zel_Node>> nodes;
-    const ZelMemory::Tree& data = *tree->d;
-    ZelMemory::ReadHold hold(data);
-    const ZelMemory::Node* parent = data.byMoniker(parentMoniker);
+    const boost::shared_ptr<ZelMemory::Store> owner(tree, tree->d.get());
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = owner->beginRead();
+    const ZelMemory::Node* parent = txn->nodeByMoniker(parentMoniker);
     if (!parent)
         return nodes;
-    const ZelMemory::SnapshotContext context = ZelMemory::childContext(data, parent, user);
-    nodes.reserve(parent->children.size());
-    for (const QString& id : parent->children) {
-        if (const ZelMemory::Node* child = data.byId(id))
-            nodes.append(ZelMemory::snapshotOf(data, *child, user, context, tree));
-    }
+    const ZelMemory::SnapshotContext context = ZelMemory::childContext(*txn, parent, user);
+    nodes.reserve(txn->childCount(*parent));
+    txn->forEachChild(*parent, [&](const ZelMemory::Node& child) {
+        nodes.append(ZelMemory::snapshotOf(*txn, child, context, owner));
+    });
+    txn->commit();
     return nodes;
 }
 

@@ -1,4 +1,4 @@
-#include "memory_session_p.h"
+#include "session_p.h"
 
 #include "Zel_MemoryNode.h"
 
@@ -101,22 +101,22 @@ void SessionObserver::treeChanged(const std::vector<Change>& changes)
     std::vector<const Change*> readable;
     readable.reserve(changes.size());
     {
-        const Tree& tree = mSession->tree->data();
-        ReadHold hold(tree);
-        const User* account = tree.user(user);
-        if (!account)
+        const std::unique_ptr<ReadTxn> txn = mSession->store().beginRead();
+        if (!txn->user(user))
             return;
+        const bool admin = txn->user(user)->admin;
         const QString* lastParent = nullptr;
         bool lastReadable = false;
         for (const Change& change : changes) {
             if (!lastParent || *lastParent != change.parentMoniker) {
-                const Node* parent = tree.byMoniker(change.parentMoniker);
-                lastReadable = parent ? (tree.permissionsOf(user, *parent) & PermRead) != 0 : account->admin;
+                const Node* parent = txn->nodeByMoniker(change.parentMoniker);
+                lastReadable = parent ? (permissionsOf(*txn, user, *parent) & PermRead) != 0 : admin;
                 lastParent = &change.parentMoniker;
             }
             if (lastReadable)
                 readable.push_back(&change);
         }
+        txn->commit();
     }
     for (const Change* readableChange : readable) {
         const Change& change = *readableChange;
@@ -254,18 +254,30 @@ void SessionState::cancelAll()
 
 // --- Work -----------------------------------------------------------------------
 
-Work::Work(SessionState& s, bool needsLogin)
-    : session(s)
-    , tree(s.tree->data())
-    , user(s.user())
+QString checkSession(const SessionState& session, bool needsLogin)
 {
     if (session.closed.load())
         fail(Zel_MemoryErrorCodes::NotConnected, QStringLiteral("The session is closed."));
     if (!session.connected.load())
         fail(Zel_MemoryErrorCodes::NotConnected,
              QStringLiteral("The connection to the server is lost; the request was not carried out."));
+    QString user = session.user();
     if (needsLogin && user.isEmpty())
         fail(Zel_MemoryErrorCodes::NotLoggedIn, QStringLiteral("Log in first: the request needs a user."));
+    return user;
+}
+
+Work::Work(SessionState& s, ReadTxn& t, const QString& u)
+    : session(s)
+    , txn(t)
+    , user(u)
+{
+}
+
+WriteWork::WriteWork(SessionState& s, WriteTxn& t, const QString& u)
+    : Work(s, t, u)
+    , write(t)
+{
 }
 
 QString Work::describe(const Node& n) const
@@ -273,50 +285,47 @@ QString Work::describe(const Node& n) const
     return QStringLiteral("\"%1\" (%2)").arg(n.name, n.moniker);
 }
 
-Node& Work::node(const boost::shared_ptr<QString>& moniker)
+const Node& Work::node(const boost::shared_ptr<QString>& moniker)
 {
     if (!moniker || moniker->isEmpty())
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No moniker was given."));
-    Node* found = tree.byMoniker(*moniker);
+    const Node* found = txn.nodeByMoniker(*moniker);
     if (!found)
         fail(Zel_MemoryErrorCodes::UnknownMoniker, QStringLiteral("No node has the moniker \"%1\".").arg(*moniker));
     require(*found, PermRead, QStringLiteral("read"));
     return *found;
 }
 
-Node& Work::nodeAtPath(const QStringList& names, bool rooted)
+const Node& Work::nodeAtPath(const QStringList& names, bool rooted)
 {
     Q_UNUSED(rooted); // paths are always taken from the root
-    const QString text = QLatin1Char('/') + names.join(QLatin1Char('/'));
-    const Node* found = tree.byId(tree.rootId);
-    for (const QString& name : names) {
-        if (!found)
-            break;
-        found = tree.childNamed(*found, name);
-    }
+    const Node* found = ZelMemory::nodeAtPath(txn, names);
     if (!found)
-        fail(Zel_MemoryErrorCodes::UnknownMoniker, QStringLiteral("No node is at the path \"%1\".").arg(text));
-    Node* n = tree.byId(found->id);
-    require(*n, PermRead, QStringLiteral("read"));
-    return *n;
+        fail(Zel_MemoryErrorCodes::UnknownMoniker,
+             QStringLiteral("No node is at the path \"%1\".").arg(QLatin1Char('/') + names.join(QLatin1Char('/'))));
+    require(*found, PermRead, QStringLiteral("read"));
+    return *found;
 }
 
-Node& Work::nodeOfMob(const QString& mobID)
+const Node& Work::nodeOfMob(const QString& mobID)
 {
     if (mobID.isEmpty())
         fail(Zel_MemoryErrorCodes::InvalidArgument, QStringLiteral("No media object ID was given."));
-    for (auto& entry : tree.nodes) {
-        if (entry.second.mobId == mobID) {
-            require(entry.second, PermRead, QStringLiteral("read"));
-            return entry.second;
-        }
-    }
-    fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("No media object has the ID \"%1\".").arg(mobID));
+    const Node* found = txn.nodeByMobId(mobID);
+    if (!found)
+        fail(Zel_MemoryErrorCodes::NotFound, QStringLiteral("No media object has the ID \"%1\".").arg(mobID));
+    require(*found, PermRead, QStringLiteral("read"));
+    return *found;
+}
+
+std::uint32_t Work::permissions(const Node& n)
+{
+    return permissionsOf(txn, user, n);
 }
 
 void Work::require(const Node& n, std::uint32_t permission, const QString& action)
 {
-    if ((tree.permissionsOf(user, n) & permission) == permission)
+    if ((permissions(n) & permission) == permission)
         return;
     QStringList names = permissionNames(permission);
     fail(Zel_MemoryErrorCodes::PermissionDenied,
@@ -326,7 +335,7 @@ void Work::require(const Node& n, std::uint32_t permission, const QString& actio
 
 void Work::requireNotReservedByOther(const Node& n, const QString& action, bool below)
 {
-    const Node* reserved = tree.reservedByOther(n, user, below);
+    const Node* reserved = reservedByOther(txn, n, user, below);
     if (!reserved)
         return;
     if (reserved->id == n.id)
@@ -364,7 +373,7 @@ void Work::requireAssetName(const QString& name)
 
 void Work::requireFreeName(const Node& parent, const QString& name, const Node* except)
 {
-    const Node* existing = tree.childNamed(parent, name);
+    const Node* existing = txn.childNamed(parent, name);
     if (existing && (!except || existing->id != except->id))
         fail(Zel_MemoryErrorCodes::NameExists,
              QStringLiteral("%1 already holds a node named \"%2\".").arg(describe(parent), name));
@@ -372,35 +381,36 @@ void Work::requireFreeName(const Node& parent, const QString& name, const Node* 
 
 boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n)
 {
-    return snapshotOf(tree, n, user, session.tree);
+    return snapshotOf(txn, n, user, session.storeRef);
 }
 
 boost::shared_ptr<Zel_Node> Work::snapshot(const Node& n, const SnapshotContext& context)
 {
-    return snapshotOf(tree, n, user, context, session.tree);
+    return snapshotOf(txn, n, context, session.storeRef);
 }
 
-SnapshotContext childContext(const Tree& tree, const Node* parent, const QString& user)
+SnapshotContext childContext(ReadTxn& txn, const Node* parent, const QString& user)
 {
     SnapshotContext context;
     context.parent = parent;
+    context.account = txn.user(user);
     if (!parent)
         return context;
-    context.path = tree.pathOf(*parent);
-    for (const Node* p = parent; p && !context.syncedProject; p = tree.parentOf(*p))
-        context.syncedProject = tree.isSyncedProject(*p);
-    context.permissions = tree.permissionsOf(user, *parent);
+    context.path = pathOf(txn, *parent);
+    for (const Node* p = parent; p && !context.syncedProject; p = parentOf(txn, *p))
+        context.syncedProject = isSyncedProject(*p);
+    context.permissions = permissionsOf(txn, user, *parent);
     return context;
 }
 
-boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& n, const QString& user,
-                                       const boost::shared_ptr<Zel_MemoryTree>& owner)
+boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& n, const QString& user,
+                                       const boost::shared_ptr<Store>& owner)
 {
-    return snapshotOf(tree, n, user, childContext(tree, tree.parentOf(n), user), owner);
+    return snapshotOf(txn, n, childContext(txn, parentOf(txn, n), user), owner);
 }
 
-boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& n, const QString& user,
-                                       const SnapshotContext& context, const boost::shared_ptr<Zel_MemoryTree>& owner)
+boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& n, const SnapshotContext& context,
+                                       const boost::shared_ptr<Store>& owner)
 {
     Zel_MemoryNode::Snapshot s;
     s.moniker = n.moniker;
@@ -411,20 +421,20 @@ boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& n, const QS
         s.path = context.path; // the root's own path is empty
         s.path.append(n.name);
     }
-    s.childrenCount = static_cast<unsigned long>(n.children.size());
+    s.childrenCount = static_cast<unsigned long>(txn.childCount(n));
     s.name = n.name;
     s.mimeType = n.mimeType;
     s.mobID = n.mobId;
-    if (n.reservation.isActive()) { // an expired reservation holds nothing
+    if (isReserved(txn, n.reservation)) { // an expired reservation holds nothing
         s.reservedBy = n.reservation.user;
         s.reservedSince = n.reservation.since;
         s.reservedUntil = n.reservation.until;
     }
-    s.syncedProject = context.syncedProject || tree.isSyncedProject(n);
+    s.syncedProject = context.syncedProject || isSyncedProject(n);
     s.userPlaced = n.userPlaced;
     s.dropTarget = Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(n.mimeType)
-        && (tree.permissionsBelow(user, n, context.permissions) & (PermAddFiles | PermAddFolders)) != 0;
-    s.properties = nodeProperties(tree, n);
+        && (permissionsBelow(context.account, n, context.permissions) & (PermAddFiles | PermAddFolders)) != 0;
+    s.properties = nodeProperties(txn, n);
     return boost::make_shared<Zel_MemoryNode>(std::move(s), owner);
 }
 

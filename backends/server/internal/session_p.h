@@ -3,23 +3,24 @@
 //
 // SessionState is the session's data, shared by the session and by every
 // request it made (a request may outlive its session). Work is the context of
-// one request's work: it checks the connection and the login once, and offers
-// the lookups and checks every operation needs, each of which throws a
-// Failure carrying the error record. runOperation() builds the operation's
-// result, runs the operation and, when it throws anything, replaces whatever
-// was collected by a fresh result holding only the failure: a Failure's own
-// record, Internal for every other exception. Operations validate everything
-// before they change the tree, so a failure leaves it unchanged. A request
+// one request's work in its transaction (WriteWork: a write transaction): it
+// offers the lookups and checks every operation needs, each of which throws a
+// Failure carrying the error record. runOperation() checks the connection and
+// the login, builds the operation's result, begins the transaction, runs the
+// operation, commits, and, when anything throws, lets the transaction roll
+// back and replaces whatever was collected by a fresh result holding only the
+// failure: a Failure's own record, Internal for every other exception.
+// Operations validate everything before they change the first record, so a
+// failure leaves the store unchanged. A request
 // that is cancelled, or whose work could not even answer, still answers with
 // a failure and the end notice (makeCanceledResult), so that no callback
 // waits for ever.
-#ifndef MEMORY_SESSION_P_H
-#define MEMORY_SESSION_P_H
+#ifndef ZEL_SERVER_SESSION_P_H
+#define ZEL_SERVER_SESSION_P_H
 
-#include "memory_tree_p.h"
+#include "rules_p.h"
 #include "Zel_MemoryError.h"
 #include "Zel_MemoryErrorCodes.h"
-#include "Zel_MemoryTree.h"
 
 #include "Zel_Req.h"
 #include "Orv_Request.h"
@@ -40,6 +41,7 @@
 #include <vector>
 
 class Orv_EngineHandle;
+class Zel_MemoryTree;
 class Zel_EventCB;
 class Zel_Node;
 class Zel_NodeListener;
@@ -97,7 +99,10 @@ private:
 class SessionState
 {
 public:
-    boost::shared_ptr<Zel_MemoryTree> tree;
+    boost::shared_ptr<Zel_MemoryTree> tree; // the session's tree, for the session's own accessors
+    // The store of the session's records; the rules reach them only through it.
+    boost::shared_ptr<Store> storeRef;
+    Store& store() const { return *storeRef; }
     boost::shared_ptr<Orv_EngineHandle> engine; // refuses requests once the engine is gone
     boost::shared_ptr<Orv_ResultQ> resultQ;
     QString applicationName;
@@ -152,29 +157,35 @@ private:
 // each of them.
 struct SnapshotContext {
     const Node* parent = nullptr;  // null for the root
-    QStringList path;              // tree.pathOf(*parent)
+    const User* account = nullptr; // the requesting user's record
+    QStringList path;              // pathOf(parent)
     bool syncedProject = false;    // the parent lies at or below a synced project
-    std::uint32_t permissions = 0; // tree.permissionsOf(user, *parent)
+    std::uint32_t permissions = 0; // permissionsOf(user, parent)
 };
 // The context of parent's children (parent null: of the root).
-SnapshotContext childContext(const Tree& tree, const Node* parent, const QString& user);
+SnapshotContext childContext(ReadTxn& txn, const Node* parent, const QString& user);
 
-// The context of one request's work.
+// Checks that the session may make a request: throws NotConnected when the
+// connection is down or the session closed, NotLoggedIn when the operation
+// needs a user and none is logged in. Answers the logged-in user.
+QString checkSession(const SessionState& session, bool needsLogin);
+
+// The context of one request's work in a read transaction.
 class Work
 {
 public:
-    // Throws NotConnected when the connection is down or the session closed,
-    // NotLoggedIn when the operation needs a user and none is logged in.
-    Work(SessionState& session, bool needsLogin);
+    Work(SessionState& session, ReadTxn& txn, const QString& user);
 
     SessionState& session;
-    Tree& tree;
+    ReadTxn& txn;
     QString user;
 
-    // --- Lookups and checks; the caller holds the tree. ---
-    Node& node(const boost::shared_ptr<QString>& moniker);
-    Node& nodeAtPath(const QStringList& names, bool rooted);
-    Node& nodeOfMob(const QString& mobID);
+    // --- Lookups and checks. ---
+    const Node& node(const boost::shared_ptr<QString>& moniker);
+    const Node& nodeAtPath(const QStringList& names, bool rooted);
+    const Node& nodeOfMob(const QString& mobID);
+    // The user's rights on the node.
+    std::uint32_t permissions(const Node& node);
     void require(const Node& node, std::uint32_t permission, const QString& action);
     void requireNotReservedByOther(const Node& node, const QString& action, bool below = true);
     void requireFolder(const Node& node);
@@ -191,6 +202,15 @@ public:
     // Where the operation's answer keeps its snapshots to release them in the
     // order they were taken (ReleaseInOrder); null when it does not.
     std::vector<boost::shared_ptr<Zel_Node>>* releasedInOrder = nullptr;
+};
+
+// The context of one request's work in a write transaction.
+class WriteWork : public Work
+{
+public:
+    WriteWork(SessionState& session, WriteTxn& txn, const QString& user);
+
+    WriteTxn& write;
 };
 
 // The deleter of a result whose operation answers many snapshots taken in one
@@ -210,18 +230,19 @@ struct ReleaseInOrder {
     }
 };
 
-// Operations whose results release their snapshots in order (memory_ops_p.h).
+// Operations whose results release their snapshots in order (ops_p.h).
 template <class Op>
 struct ReleasesInOrder : std::false_type {
 };
 
-// The snapshot of node that the requests of user answer with (tree is owner's
-// data, held by the caller); context is that of node's parent.
-boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& node, const QString& user,
-                                       const SnapshotContext& context, const boost::shared_ptr<Zel_MemoryTree>& owner);
+// The snapshot of node that the requests of user answer with (owner: the
+// store the snapshot reads its properties from afresh); context is that of
+// node's parent.
+boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& node, const SnapshotContext& context,
+                                       const boost::shared_ptr<Store>& owner);
 // The same, working the context out.
-boost::shared_ptr<Zel_Node> snapshotOf(const Tree& tree, const Node& node, const QString& user,
-                                       const boost::shared_ptr<Zel_MemoryTree>& owner);
+boost::shared_ptr<Zel_Node> snapshotOf(ReadTxn& txn, const Node& node, const QString& user,
+                                       const boost::shared_ptr<Store>& owner);
 
 // A final result of the operation's result class holding only the failure.
 template <class Op>
@@ -236,9 +257,10 @@ boost::shared_ptr<Orv_Result> failureResult(const boost::shared_ptr<typename Op:
 // Runs the session's fault hook, if it has one, for the operation's request.
 void runFaultHook(const SessionState& session, const char* operationName);
 
-// Runs an operation into a new final result of its result class. Every
-// exception becomes a failure answer; only the unwinding that ends a thread
-// (which carries no C++ exception object) goes on.
+// Runs an operation into a new final result of its result class, in one
+// transaction of the session's store. Every exception becomes a failure
+// answer (the transaction then rolls back); only the unwinding that ends a
+// thread (which carries no C++ exception object) goes on.
 template <class Op>
 boost::shared_ptr<Orv_Result> runOperation(SessionState& session, const boost::shared_ptr<typename Op::Callback>& callback,
                                            const typename Op::Args& args)
@@ -251,11 +273,23 @@ boost::shared_ptr<Orv_Result> runOperation(SessionState& session, const boost::s
             result.reset(new Result(callback, true), ReleaseInOrder<Result>());
         else
             result = boost::make_shared<Result>(callback, true);
-        Work work(session, Op::NeedsLogin);
-        if constexpr (ReleasesInOrder<Op>::value)
-            work.releasedInOrder = &boost::get_deleter<ReleaseInOrder<Result>>(result)->snapshots;
+        const QString user = checkSession(session, Op::NeedsLogin);
         runFaultHook(session, Op::OperationName);
-        Op::run(work, args, *result);
+        auto run = [&](typename Op::WorkType& work, ReadTxn& txn) {
+            if constexpr (ReleasesInOrder<Op>::value)
+                work.releasedInOrder = &boost::get_deleter<ReleaseInOrder<Result>>(result)->snapshots;
+            Op::run(work, args, *result);
+            txn.commit();
+        };
+        if constexpr (std::is_same<typename Op::WorkType, WriteWork>::value) {
+            const std::unique_ptr<WriteTxn> txn = session.store().beginWrite();
+            WriteWork work(session, *txn, user);
+            run(work, *txn);
+        } else {
+            const std::unique_ptr<ReadTxn> txn = session.store().beginRead();
+            Work work(session, *txn, user);
+            run(work, *txn);
+        }
         return result;
     } catch (const Failure& failure) {
         error = failure.error;

@@ -9,8 +9,8 @@
 // conditionFailed). finished() follows the last answer of a final result when
 // the callback has such a handler (login and root-node callbacks have none).
 // The delivery protocol is Zel_Res's: one answer per deliverNext().
-#ifndef MEMORY_RESULTS_P_H
-#define MEMORY_RESULTS_P_H
+#ifndef ZEL_SERVER_RESULTS_P_H
+#define ZEL_SERVER_RESULTS_P_H
 
 #include "Zel_Error.h"
 #include "Zel_Res.h"

@@ -3,13 +3,13 @@
 // Each operation names the callback it answers, the result class it answers
 // with (the library's where it defines one, MemoryRes otherwise), whether it
 // needs a logged-in user, its arguments, and its work run(). execute() is
-// runOperation() (memory_session_p.h) instantiated in the operation's source
+// runOperation() (session_p.h) instantiated in the operation's source
 // file, so this header needs only the callback and result names.
-#ifndef MEMORY_OPS_P_H
-#define MEMORY_OPS_P_H
+#ifndef ZEL_SERVER_OPS_P_H
+#define ZEL_SERVER_OPS_P_H
 
-#include "memory_results_p.h"
-#include "memory_session_p.h"
+#include "results_p.h"
+#include "session_p.h"
 
 #include "Zel_DependencySPList.h"
 #include "Zel_Directory.h"
@@ -110,7 +110,7 @@ class Zel_SetUserSettingsRes;
 class Zel_SettingsRes;
 class Zel_StartupRes;
 
-// A failure as the only answer of a library result (memory_failures.cpp).
+// A failure as the only answer of a library result (failures.cpp).
 void failInto(Zel_AddDependencyRes& result, const boost::shared_ptr<Zel_Error>& error);
 void failInto(Zel_AssociationsRes& result, const boost::shared_ptr<Zel_Error>& error);
 void failInto(Zel_CheckinRes& result, const boost::shared_ptr<Zel_Error>& error);
@@ -142,7 +142,7 @@ namespace ZelMemory {
 
 typedef boost::shared_ptr<QString> MonikerSP;
 
-// Shared by the operations (memory_ops_browse.cpp).
+// Shared by the operations (ops/browse.cpp).
 boost::shared_ptr<Zel_Error> ok();
 boost::shared_ptr<QString> sharedText(const QString& text);
 // The children of the node the user may read, as snapshots in node order
@@ -151,19 +151,22 @@ std::vector<boost::shared_ptr<Zel_Node>> readableChildren(Work& work, const Node
 // The node's locators (restrictions = false) or restrictions (true).
 QList<Zel_FrameLocator> markersOf(const Node& node, bool restrictions);
 // Fails with TooDeep unless a subtree of the given height (0: one node) fits
-// below parent within MaxDepth (memory_ops_change.cpp).
+// below parent within MaxDepth (ops/change.cpp).
 void requireDepth(Work& work, const Node& parent, int height);
+// Reports node as updated under its parent (none for the root).
+void reportUpdated(WriteWork& work, const Node& node);
 
-#define ZEL_MEMORY_OPERATION_STRUCT(Name, CallbackClass, ResultClass, needsLogin, Extra, ...)                   \
+#define ZEL_MEMORY_OPERATION_STRUCT(Name, WorkClass, CallbackClass, ResultClass, needsLogin, Extra, ...)        \
     struct Name {                                                                                                  \
         typedef CallbackClass Callback;                                                                            \
         typedef ResultClass Result;                                                                                \
+        typedef WorkClass WorkType;                                                                                \
         static const bool NeedsLogin = needsLogin;                                                                 \
         struct Args {                                                                                              \
             __VA_ARGS__                                                                                            \
         };                                                                                                         \
         static constexpr const char* OperationName = #Name;                                                        \
-        static void run(Work& work, const Args& args, Result& result);                                             \
+        static void run(WorkClass& work, const Args& args, Result& result);                                        \
         static boost::shared_ptr<Orv_Result> execute(SessionState& session,                                       \
                                                      const boost::shared_ptr<Callback>& callback, const Args& args); \
         static boost::shared_ptr<Orv_Result> failure(const boost::shared_ptr<Callback>& callback,                 \
@@ -173,14 +176,22 @@ void requireDepth(Work& work, const Node& parent, int height);
 
 // An operation: its callback, its result, whether it needs a login, and its
 // arguments, which the request factory fills from its own parameters in order
-// (zel_requests.def); members past those start value-initialised.
+// (zel_requests.def); members past those start value-initialised. It runs in
+// a read transaction (Work); the WRITE forms run in a write transaction
+// (WriteWork).
 #define ZEL_MEMORY_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                                   \
-    ZEL_MEMORY_OPERATION_STRUCT(Name, CallbackClass, ResultClass, needsLogin, , __VA_ARGS__)
+    ZEL_MEMORY_OPERATION_STRUCT(Name, Work, CallbackClass, ResultClass, needsLogin, , __VA_ARGS__)
+#define ZEL_MEMORY_WRITE_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                             \
+    ZEL_MEMORY_OPERATION_STRUCT(Name, WriteWork, CallbackClass, ResultClass, needsLogin, , __VA_ARGS__)
 
 // The same for an operation that also sets up its arguments or callback when
 // its request is made, on the caller's thread (prepare()).
 #define ZEL_MEMORY_PREPARED_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                          \
-    ZEL_MEMORY_OPERATION_STRUCT(Name, CallbackClass, ResultClass, needsLogin,                                     \
+    ZEL_MEMORY_OPERATION_STRUCT(Name, Work, CallbackClass, ResultClass, needsLogin,                               \
+                                static void prepare(const boost::shared_ptr<Callback>& callback, Args& args);,     \
+                                __VA_ARGS__)
+#define ZEL_MEMORY_PREPARED_WRITE_OPERATION(Name, CallbackClass, ResultClass, needsLogin, ...)                    \
+    ZEL_MEMORY_OPERATION_STRUCT(Name, WriteWork, CallbackClass, ResultClass, needsLogin,                          \
                                 static void prepare(const boost::shared_ptr<Callback>& callback, Args& args);,     \
                                 __VA_ARGS__)
 
@@ -240,38 +251,38 @@ ZEL_MEMORY_OPERATION(GetPropertiesOp, Zel_PropertyListCB, MemoryRes<Zel_Property
 // conditional: the callback is a Zel_ConditionalSetPropertiesCB; each
 // property's custom values text then holds the value the application expects
 // the property to have now.
-ZEL_MEMORY_PREPARED_OPERATION(SetPropertiesOp, Zel_SetPropertiesCB, MemoryRes<Zel_SetPropertiesCB>, true,
+ZEL_MEMORY_PREPARED_WRITE_OPERATION(SetPropertiesOp, Zel_SetPropertiesCB, MemoryRes<Zel_SetPropertiesCB>, true,
                               MonikerSP moniker; Zel_PropertyList properties; bool conditional;)
-ZEL_MEMORY_OPERATION(CreatePropertyOp, Zel_CreatePropertyCB, MemoryRes<Zel_CreatePropertyCB>, true,
+ZEL_MEMORY_WRITE_OPERATION(CreatePropertyOp, Zel_CreatePropertyCB, MemoryRes<Zel_CreatePropertyCB>, true,
                      MonikerSP moniker; Zel_Property property;)
 ZEL_MEMORY_OPERATION(MediaResolutionsOp, Zel_MediaResolutionsCB, Zel_MediaResolutionsRes, true, int unused;)
 ZEL_MEMORY_OPERATION(NodeResolutionsOp, Zel_NodeResolutionsCB, Zel_NodeResolutionsRes, true, MonikerSP moniker;)
 
 // --- Changing the tree ----------------------------------------------------
-ZEL_MEMORY_OPERATION(CreateFolderOp, Zel_CreateFolderCB, MemoryRes<Zel_CreateFolderCB>, true, MonikerSP parent;
+ZEL_MEMORY_WRITE_OPERATION(CreateFolderOp, Zel_CreateFolderCB, MemoryRes<Zel_CreateFolderCB>, true, MonikerSP parent;
                      QString name;)
-ZEL_MEMORY_OPERATION(CreateFolderUniqueOp, Zel_CreateFolderUniqueCB, Zel_CreateFolderUniqueRes, true,
+ZEL_MEMORY_WRITE_OPERATION(CreateFolderUniqueOp, Zel_CreateFolderUniqueCB, Zel_CreateFolderUniqueRes, true,
                      MonikerSP parent; QString name;)
-ZEL_MEMORY_OPERATION(CreateNodeUniqueOp, Zel_ResultCB, Zel_CreateNodeUniqueRes, true, MonikerSP parent;
+ZEL_MEMORY_WRITE_OPERATION(CreateNodeUniqueOp, Zel_ResultCB, Zel_CreateNodeUniqueRes, true, MonikerSP parent;
                      QString name; Zel_PropertyList properties;)
-ZEL_MEMORY_OPERATION(RenameNodeOp, Zel_RenameNodeCB, MemoryRes<Zel_RenameNodeCB>, true, MonikerSP moniker;
+ZEL_MEMORY_WRITE_OPERATION(RenameNodeOp, Zel_RenameNodeCB, MemoryRes<Zel_RenameNodeCB>, true, MonikerSP moniker;
                      QString name;)
-ZEL_MEMORY_OPERATION(RenameUniqueOp, Zel_RenameUniqueCB, Zel_RenameUniqueRes, true, MonikerSP moniker;
+ZEL_MEMORY_WRITE_OPERATION(RenameUniqueOp, Zel_RenameUniqueCB, Zel_RenameUniqueRes, true, MonikerSP moniker;
                      QString name;)
-ZEL_MEMORY_OPERATION(MoveNodeOp, Zel_MoveNodeCB, MemoryRes<Zel_MoveNodeCB>, true, MonikerSP moniker;
+ZEL_MEMORY_WRITE_OPERATION(MoveNodeOp, Zel_MoveNodeCB, MemoryRes<Zel_MoveNodeCB>, true, MonikerSP moniker;
                      MonikerSP destination;)
-ZEL_MEMORY_OPERATION(CopyNodeOp, Zel_CopyNodeCB, MemoryRes<Zel_CopyNodeCB>, true, MonikerSP moniker;
+ZEL_MEMORY_WRITE_OPERATION(CopyNodeOp, Zel_CopyNodeCB, MemoryRes<Zel_CopyNodeCB>, true, MonikerSP moniker;
                      MonikerSP destination;)
-ZEL_MEMORY_OPERATION(DeleteNodeOp, Zel_ResultBoolCB, Zel_DeleteNodeRes, true, MonikerSP moniker;)
-ZEL_MEMORY_OPERATION(DeleteOp, Zel_DeleteCB, Zel_DeleteRes, true, QStringList monikers; bool remoteMedia;
+ZEL_MEMORY_WRITE_OPERATION(DeleteNodeOp, Zel_ResultBoolCB, Zel_DeleteNodeRes, true, MonikerSP moniker;)
+ZEL_MEMORY_WRITE_OPERATION(DeleteOp, Zel_DeleteCB, Zel_DeleteRes, true, QStringList monikers; bool remoteMedia;
                      bool localMedia;)
-ZEL_MEMORY_OPERATION(AddDependencyOp, Zel_DependencyCB, Zel_AddDependencyRes, true, MonikerSP moniker;
+ZEL_MEMORY_WRITE_OPERATION(AddDependencyOp, Zel_DependencyCB, Zel_AddDependencyRes, true, MonikerSP moniker;
                      Zel_DependencySPList dependencies;)
 
 // --- Reservations and permissions -----------------------------------------
-ZEL_MEMORY_OPERATION(CreateReservationOp, Zel_CreateReservationCB, Zel_CreateReservationRes, true,
+ZEL_MEMORY_WRITE_OPERATION(CreateReservationOp, Zel_CreateReservationCB, Zel_CreateReservationRes, true,
                      MonikerSP moniker; QDateTime expiry;)
-ZEL_MEMORY_OPERATION(RemoveReservationOp, Zel_RemoveReservationCB, Zel_RemoveReservationRes, true,
+ZEL_MEMORY_WRITE_OPERATION(RemoveReservationOp, Zel_RemoveReservationCB, Zel_RemoveReservationRes, true,
                      MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(GetReservationsOp, Zel_GetReservationsCB, Zel_GetReservationsRes, true, MonikerSP moniker;)
 ZEL_MEMORY_OPERATION(NodePermissionsOp, Zel_NodePermissionsCB, Zel_NodePermissionsRes, true, MonikerSP moniker;)
@@ -282,22 +293,22 @@ ZEL_MEMORY_OPERATION(GetUserPriviledgesOp, Zel_NodePermissionsCB, Zel_NodePermis
 // kind: false for locators, true for restrictions.
 ZEL_MEMORY_OPERATION(GetFrameLocatorListOp, Zel_FrameLocatorListCB, MemoryRes<Zel_FrameLocatorListCB>, true,
                      MonikerSP moniker;)
-ZEL_MEMORY_OPERATION(AddFrameLocatorListOp, Zel_FrameLocatorListCB, MemoryRes<Zel_FrameLocatorListCB>, true,
+ZEL_MEMORY_WRITE_OPERATION(AddFrameLocatorListOp, Zel_FrameLocatorListCB, MemoryRes<Zel_FrameLocatorListCB>, true,
                      MonikerSP moniker; QList<Zel_FrameLocator> markers;)
-ZEL_MEMORY_OPERATION(DeleteFrameLocatorListOp, Zel_FrameLocatorListCB, MemoryRes<Zel_FrameLocatorListCB>, true,
+ZEL_MEMORY_WRITE_OPERATION(DeleteFrameLocatorListOp, Zel_FrameLocatorListCB, MemoryRes<Zel_FrameLocatorListCB>, true,
                      MonikerSP moniker; QList<Zel_FrameLocator> markers;)
 ZEL_MEMORY_OPERATION(GetFrameRestrictionListOp, Zel_FrameRestrictionListCB, MemoryRes<Zel_FrameRestrictionListCB>,
                      true, MonikerSP moniker;)
-ZEL_MEMORY_OPERATION(AddFrameRestrictionListOp, Zel_FrameRestrictionListCB, MemoryRes<Zel_FrameRestrictionListCB>,
+ZEL_MEMORY_WRITE_OPERATION(AddFrameRestrictionListOp, Zel_FrameRestrictionListCB, MemoryRes<Zel_FrameRestrictionListCB>,
                      true, MonikerSP moniker; QList<Zel_FrameLocator> markers;)
-ZEL_MEMORY_OPERATION(DeleteFrameRestrictionListOp, Zel_FrameRestrictionListCB,
+ZEL_MEMORY_WRITE_OPERATION(DeleteFrameRestrictionListOp, Zel_FrameRestrictionListCB,
                      MemoryRes<Zel_FrameRestrictionListCB>, true, MonikerSP moniker; QList<Zel_FrameLocator> markers;)
 
 // --- Media objects ----------------------------------------------------------
 ZEL_MEMORY_OPERATION(AnalyzeOp, Zel_AnalyzeCB, MemoryRes<Zel_AnalyzeCB>, true, QStringList files;)
-ZEL_MEMORY_OPERATION(CheckinOp, Zel_CheckinCB, Zel_CheckinRes, true, Zel_MobDescList mobs; MonikerSP folder;)
-ZEL_MEMORY_OPERATION(CheckinLocalBinOp, Zel_CheckinCB, Zel_CheckinRes, true, QString binFile; MonikerSP folder;)
-ZEL_MEMORY_OPERATION(CheckinUpdateOp, Zel_CheckinUpdateCB, Zel_CheckinUpdateRes, true, Zel_MobDescList mobs;)
+ZEL_MEMORY_WRITE_OPERATION(CheckinOp, Zel_CheckinCB, Zel_CheckinRes, true, Zel_MobDescList mobs; MonikerSP folder;)
+ZEL_MEMORY_WRITE_OPERATION(CheckinLocalBinOp, Zel_CheckinCB, Zel_CheckinRes, true, QString binFile; MonikerSP folder;)
+ZEL_MEMORY_WRITE_OPERATION(CheckinUpdateOp, Zel_CheckinUpdateCB, Zel_CheckinUpdateRes, true, Zel_MobDescList mobs;)
 ZEL_MEMORY_OPERATION(MobNodeOp, Zel_MobNodeCB, MemoryRes<Zel_MobNodeCB>, true, boost::shared_ptr<Zel_MobID> mob;)
 ZEL_MEMORY_OPERATION(MobBinaryOp, Zel_MobBinaryCB, MemoryRes<Zel_MobBinaryCB>, true, boost::shared_ptr<Zel_MobID> mob;)
 ZEL_MEMORY_OPERATION(MobBinaryDnDOp, Zel_MobBinaryDnDCB, MemoryRes<Zel_MobBinaryDnDCB>, true, Zel_MobIDList mobs;)
@@ -310,15 +321,15 @@ ZEL_MEMORY_OPERATION(LoginOp, Zel_LoginCB, MemoryRes<Zel_LoginCB>, false, QStrin
 ZEL_MEMORY_OPERATION(StartupOp, Zel_StartupCB, Zel_StartupRes, true, int unused;)
 ZEL_MEMORY_OPERATION(GetApplicationSettingsOp, Zel_GetApplicationSettingsCB, Zel_GetApplicationSettingsRes, true,
                      QString application;)
-ZEL_MEMORY_OPERATION(SetApplicationSettingsOp, Zel_SetApplicationSettingsCB, Zel_SetApplicationSettingsRes, true,
+ZEL_MEMORY_WRITE_OPERATION(SetApplicationSettingsOp, Zel_SetApplicationSettingsCB, Zel_SetApplicationSettingsRes, true,
                      QString application; QString xml;)
 ZEL_MEMORY_OPERATION(GetUserSettingsOp, Zel_GetUserSettingsCB, Zel_GetUserSettingsRes, true,
                      Zel_GetUserSettingsCB::UserSettingsType type;)
-ZEL_MEMORY_OPERATION(SetUserSettingsOp, Zel_SetUserSettingsCB, Zel_SetUserSettingsRes, true,
+ZEL_MEMORY_WRITE_OPERATION(SetUserSettingsOp, Zel_SetUserSettingsCB, Zel_SetUserSettingsRes, true,
                      Zel_GetUserSettingsCB::UserSettingsType type; QString xml;)
 ZEL_MEMORY_OPERATION(GetWorkgroupSettingsOp, Zel_SettingsCB, Zel_SettingsRes, true, int unused;)
 ZEL_MEMORY_OPERATION(GetSettingsOp, Zel_GetSettingsCB, MemoryRes<Zel_GetSettingsCB>, true, QString name;)
-ZEL_MEMORY_OPERATION(SaveSettingsOp, Zel_SaveSettingsCB, MemoryRes<Zel_SaveSettingsCB>, true, QString name;
+ZEL_MEMORY_WRITE_OPERATION(SaveSettingsOp, Zel_SaveSettingsCB, MemoryRes<Zel_SaveSettingsCB>, true, QString name;
                      QString xml;)
 
 // The operations that answer a folder's children release their snapshots in

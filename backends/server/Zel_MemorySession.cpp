@@ -1,8 +1,9 @@
 #include "Zel_MemorySession.h"
 #include "zel_version.h"
 
-#include "memory_ops_p.h"
-#include "memory_session_p.h"
+#include "ops_p.h"
+#include "session_p.h"
+#include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 #include "Zel_MemoryTree.h"
 
@@ -95,10 +96,10 @@ Zel_ResolutionIDList resolutionsOf(const boost::shared_ptr<Zel_MemoryTree>& tree
 {
     Zel_ResolutionIDList list;
     if (tree) {
-        ZelMemory::Tree& data = tree->data();
-        ZelMemory::ReadHold hold(data);
-        for (const ZelMemory::Resolution& r : data.resolutions)
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->data().beginRead();
+        for (const ZelMemory::Resolution& r : txn->resolutions())
             list.append(Zel_ResolutionID(r.label, r.id));
+        txn->commit();
     }
     return list;
 }
@@ -145,6 +146,8 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     , mState(new ZelMemory::SessionState)
 {
     mState->tree = tree ? tree : Zel_MemoryTree::sample();
+    // The store is the tree's records, kept alive by the tree.
+    mState->storeRef = boost::shared_ptr<ZelMemory::Store>(mState->tree, &mState->tree->data());
     if (engine) {
         mState->engine = engine->getHandle();
         mState->resultQ = engine->getResultQ();
@@ -157,8 +160,8 @@ Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tr
     setRemoteClientStatus(false);
 
     mObserver.reset(new ZelMemory::SessionObserver(getEventCBSP(), mState->resultQ, mState));
-    mState->tree->data().addObserver(mObserver);
-    mPropertyManager = mState->tree->data().propertyManager;
+    mState->store().addObserver(mObserver);
+    mPropertyManager = mState->store().propertyManager;
     registerManager(mPropertyManager);
 }
 
@@ -166,7 +169,7 @@ Zel_MemorySession::~Zel_MemorySession()
 {
     // Requests that outlive the session fail with NotConnected from now on.
     mState->closed = true;
-    mState->tree->data().removeObserver(mObserver.get());
+    mState->store().removeObserver(mObserver.get());
     unregisterManager(mPropertyManager);
 }
 
@@ -184,9 +187,8 @@ QString Zel_MemorySession::getServerVersion() const
 
 QString Zel_MemorySession::getWorkgroupName() const
 {
-    ZelMemory::Tree& data = mState->tree->data();
-    ZelMemory::ReadHold hold(data);
-    for (const auto& setting : data.workgroupSettings) {
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    for (const auto& setting : txn->workgroupSettings()) {
         if (setting.first == QLatin1String("Workgroup.Name"))
             return setting.second;
     }
@@ -245,9 +247,8 @@ bool Zel_MemorySession::isValidMoniker(const QString& moniker) const
 {
     if (moniker.startsWith(ZelMemory::MonikerScheme) && moniker.size() > ZelMemory::MonikerScheme.size())
         return true;
-    ZelMemory::Tree& data = mState->tree->data();
-    ZelMemory::ReadHold hold(data);
-    return data.byMoniker(moniker) != nullptr;
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    return txn->nodeByMoniker(moniker) != nullptr;
 }
 
 boost::shared_ptr<Orv_ResultQ> Zel_MemorySession::getResultQSP() const
@@ -286,12 +287,11 @@ QDateTime Zel_MemorySession::getServerTime() const
 bool Zel_MemorySession::isReadOnly() const
 {
     const QString user = mState->user();
-    ZelMemory::Tree& data = mState->tree->data();
-    ZelMemory::ReadHold hold(data);
-    const ZelMemory::Node* root = data.byId(data.rootId);
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    const ZelMemory::Node* root = txn->root();
     const std::uint32_t writing = ZelMemory::PermAddFiles | ZelMemory::PermAddFolders | ZelMemory::PermWriteAttributes
         | ZelMemory::PermDeleteAssets;
-    return user.isEmpty() || !root || (data.permissionsOf(user, *root) & writing) == 0;
+    return user.isEmpty() || !root || (ZelMemory::permissionsOf(*txn, user, *root) & writing) == 0;
 }
 
 int Zel_MemorySession::getMaxNameLength() const

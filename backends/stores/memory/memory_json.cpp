@@ -14,6 +14,7 @@
 // types and file version, the depth limit and the settings limits
 // (Zel_MemoryLimits.h). Nodes are read and written without recursion.
 #include "memory_tree_p.h"
+#include "rules_p.h"
 
 #include "Zel_MimeTypeSpec.h"
 #include "Zel_MimeTypeValue.h"
@@ -422,7 +423,7 @@ private:
     void readNodes(const QJsonObject& rootObject)
     {
         mSteps.push_back(PathStep{-1, 0});
-        Node& root = readNode(rootObject, 0, nullptr);
+        StoredNode& root = readNode(rootObject, 0, nullptr);
         if (!Zel_MimeTypeSpec(Zel_MimeTypes_Containers).isType(root.mimeType))
             fail(QStringLiteral("root.mimeType"), QStringLiteral("the root must be a container (project, bin, folder, catalog, workspace), not \"%1\"").arg(root.mimeType));
         mTree.rootId = root.id;
@@ -430,11 +431,11 @@ private:
         struct Pending {
             QJsonValue value;
             int step;
-            Node* parent; // references into the node table stay valid
+            StoredNode* parent; // references into the node table stay valid
             int depth;
         };
         std::vector<Pending> pending;
-        auto pushChildren = [&](const QJsonObject& o, int step, Node& node, int depth) {
+        auto pushChildren = [&](const QJsonObject& o, int step, StoredNode& node, int depth) {
             const QJsonArray children = optArray(o, QStringLiteral("children"), Where(mSteps, step));
             if (children.isEmpty())
                 return;
@@ -452,20 +453,20 @@ private:
             if (!next.value.isObject())
                 fail(where.text(), QStringLiteral("expected an object"));
             const QJsonObject child = next.value.toObject();
-            Node* parent = next.parent;
+            StoredNode* parent = next.parent;
             if (next.depth > MaxDepth)
                 fail(where.text(), QStringLiteral("lies %1 levels below the root; the server allows at most %2").arg(next.depth).arg(MaxDepth));
-            Node& stored = readNode(child, next.step, parent);
+            StoredNode& stored = readNode(child, next.step, parent);
             pushChildren(child, next.step, stored, next.depth);
         }
     }
 
     // One node without its children, inserted under parent (the root when
     // parent is null).
-    Node& readNode(const QJsonObject& o, int step, Node* parent)
+    StoredNode& readNode(const QJsonObject& o, int step, StoredNode* parent)
     {
         const Where path(mSteps, step);
-        Node node;
+        StoredNode node;
         node.id = optString(o, QStringLiteral("id"), path, QString());
         // A generated ID, and the moniker made from it, are known to be new
         // (generatedId); only given ones are looked up.
@@ -581,7 +582,7 @@ private:
             node.media.append(file);
         }
 
-        Node* stored = nullptr;
+        StoredNode* stored = nullptr;
         if (parent) {
             // A name the parent's index of names already holds is a second
             // child of that name; the index is looked up once, by the
@@ -641,7 +642,7 @@ private:
     Tree& mTree;
     QString mSource;
     std::vector<PathStep> mSteps;      // every node's place in the file; the root's first
-    std::vector<std::pair<Node*, int>> mMasters; // the nodes that name a master, with their steps, in file order
+    std::vector<std::pair<StoredNode*, int>> mMasters; // the nodes that name a master, with their steps, in file order
     QSet<QString> mExplicitIds;
     QSet<QString> mExplicitMonikers;
     QSet<QString> mMobIds;
@@ -770,25 +771,30 @@ QJsonObject nodeFieldsToJson(const Node& node)
 // A node and its subtree, built without recursion: a stack of open nodes,
 // each with the children array it is filling; a node's object is complete
 // when its last child is, and then goes into its parent's array.
-QJsonObject nodeToJson(const Tree& tree, const Node& node)
+template <class ChildrenOf>
+QJsonObject nodeToJson(const Node& node, ChildrenOf childrenOf)
 {
     struct Open {
         const Node* node;
         QJsonObject object;
         QJsonArray children;
-        int next;
+        std::vector<const Node*> childRecords;
+        std::size_t next;
     };
     std::vector<Open> open;
-    open.push_back(Open{&node, nodeFieldsToJson(node), QJsonArray(), 0});
+    auto push = [&](const Node& n) {
+        open.push_back(Open{&n, nodeFieldsToJson(n), QJsonArray(), {}, 0});
+        childrenOf(n, open.back().childRecords);
+    };
+    push(node);
     for (;;) {
         Open& top = open.back();
-        if (top.next < top.node->children.size()) {
-            const Node* child = tree.byId(top.node->children.at(top.next++));
-            if (child)
-                open.push_back(Open{child, nodeFieldsToJson(*child), QJsonArray(), 0});
+        if (top.next < top.childRecords.size()) {
+            const Node* child = top.childRecords[top.next++];
+            push(*child);
             continue;
         }
-        if (!top.node->children.isEmpty())
+        if (!top.childRecords.empty())
             top.object.insert(QStringLiteral("children"), top.children);
         QJsonObject done = top.object;
         open.pop_back();
@@ -978,9 +984,11 @@ bool loadTree(Tree& tree, const QByteArray& json, const QString& sourceName, QSt
     return true;
 }
 
-QByteArray nodeJson(const Tree& tree, const Node& node)
+QByteArray nodeJson(ReadTxn& txn, const Node& node)
 {
-    return QJsonDocument(nodeToJson(tree, node)).toJson(QJsonDocument::Compact);
+    const QJsonObject object
+        = nodeToJson(node, [&txn](const Node& n, std::vector<const Node*>& out) { txn.children(n, out); });
+    return QJsonDocument(object).toJson(QJsonDocument::Compact);
 }
 
 QByteArray saveTree(const Tree& tree)
@@ -1050,8 +1058,15 @@ QByteArray saveTree(const Tree& tree)
     if (!tree.linkedProjects.isEmpty())
         top.insert(QStringLiteral("linkedProjects"), QJsonArray::fromStringList(tree.linkedProjects));
 
-    if (const Node* root = tree.byId(tree.rootId))
-        top.insert(QStringLiteral("root"), nodeToJson(tree, *root));
+    if (const Node* root = tree.byId(tree.rootId)) {
+        auto childrenOf = [&tree](const Node& n, std::vector<const Node*>& out) {
+            for (const QString& id : static_cast<const StoredNode&>(n).children) {
+                if (const StoredNode* child = tree.byId(id))
+                    out.push_back(child);
+            }
+        };
+        top.insert(QStringLiteral("root"), nodeToJson(*root, childrenOf));
+    }
     return QJsonDocument(top).toJson(QJsonDocument::Indented);
 }
 
