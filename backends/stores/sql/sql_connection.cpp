@@ -1,6 +1,7 @@
 #include "sql_connection_p.h"
 
 #include <atomic>
+#include <utility>
 
 namespace ZelSql {
 
@@ -52,7 +53,7 @@ QSqlQuery Connection::exec(const QString& sql, const QVariantList& values)
     }
     if (!ok) {
         StoreError error = mDialect.mapError(query.lastError(), *this, sql, false);
-        mFailed = query;
+        mFailed = std::move(query); // a copy where Qt has no move (Qt 5)
         throw error;
     }
     return query;
