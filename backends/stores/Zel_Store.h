@@ -1,0 +1,83 @@
+// Zel_Store: a store of the backend's records, opened by its URL.
+//
+// The backend's rules run over a store: the in-memory tree, or a database.
+// An application names the store with a URL and opens a session on it:
+//
+//     QString error;
+//     boost::shared_ptr<Zel_MemorySession> session
+//         = Zel_MemorySession::open(QStringLiteral("memory:tree.json"), &engine, "my-app", &error);
+//     if (!session)
+//         qWarning() << error;   // "tree.json: cannot be read: No such file or directory"
+//
+// The URL forms:
+//   memory:                  the bundled sample tree, held in this process
+//   memory:FILE.json         a tree file (Zel_MemoryTree's JSON form), held in
+//                            this process; the file is read, never written
+//   sqlite:PATH              a SQLite file (sqlite:///ABSOLUTE/PATH too)
+//   postgresql://USER@HOST:PORT/DATABASE?PARAM=VALUE...
+//                            a PostgreSQL database, as libpq reads the URL;
+//                            what it leaves out comes from libpq's PG*
+//                            environment variables and defaults
+// Opening fails with a message that names what was wrong (the URL, with any
+// password masked, the file, the store that is not built in) and creates or
+// changes nothing.
+//
+// Several sessions may share one opened store (they then hear each other's
+// changes); the store lives as long as the last of them or the last
+// reference. Opening is thread-safe.
+#ifndef ZEL_STORE_H
+#define ZEL_STORE_H
+
+#include "zel_memory_export.h"
+
+#include <QString>
+#include <boost/shared_ptr.hpp>
+
+#include <memory>
+
+class Zel_MemoryTree;
+
+namespace ZelMemory {
+class Store;
+struct OpenedStore;
+}
+
+class ZEL_MEMORY_EXPORT Zel_Store
+{
+public:
+    enum Kind { Memory, Sqlite, Postgresql };
+
+    // The store the URL names; empty on failure, with *error (when given)
+    // saying what was wrong.
+    static boost::shared_ptr<Zel_Store> open(const QString& url, QString* error = nullptr);
+    // The store that holds tree (the sample when tree is empty).
+    static boost::shared_ptr<Zel_Store> ofTree(const boost::shared_ptr<Zel_MemoryTree>& tree);
+
+    ~Zel_Store();
+
+    Kind kind() const;
+    // "memory", "sqlite" or "postgresql".
+    QString kindName() const;
+    // The URL the store was opened with, any password masked ("memory:" for
+    // a tree given by ofTree).
+    QString url() const;
+    // The server's name, as sessions on the store answer getServerName().
+    QString serverName() const;
+    // The version of the store's schema; 0 for a store without one (memory).
+    int schemaVersion() const;
+    // The in-memory tree of a memory store; empty for every other kind.
+    boost::shared_ptr<Zel_MemoryTree> memoryTree() const;
+
+    // The backend's own access to the records (not for applications).
+    boost::shared_ptr<ZelMemory::Store> dataSP() const;
+
+private:
+    explicit Zel_Store(Kind kind);
+    Zel_Store(const Zel_Store&) = delete;
+    Zel_Store& operator=(const Zel_Store&) = delete;
+
+    struct Private;
+    std::unique_ptr<Private> d;
+};
+
+#endif
