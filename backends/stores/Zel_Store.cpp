@@ -9,7 +9,10 @@
 #include "sql_url_p.h"
 #endif
 
+#include <QFileInfo>
+
 #include <exception>
+#include <functional>
 #include <mutex>
 
 namespace {
@@ -45,6 +48,48 @@ const char* storeTitle(Zel_Store::Kind kind)
     return "the store";
 }
 
+// A memory tree that holds nothing: the sample, emptied.
+boost::shared_ptr<Zel_MemoryTree> emptyTree()
+{
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    const std::unique_ptr<ZelMemory::WriteTxn> txn = tree->data().beginWrite();
+    txn->removeEverything();
+    txn->commit();
+    return tree;
+}
+
+// Copies every record of from into to (which holds none): the tables, then
+// the nodes depth first, each folder's children in their order.
+void copyRecords(ZelMemory::ReadTxn& from, ZelMemory::WriteTxn& to)
+{
+    to.setServerTables(from.serverTables());
+    const ZelMemory::Node* root = from.root();
+    if (!root)
+        return;
+    std::function<void(const ZelMemory::Node&, const ZelMemory::Node*)> copy
+        = [&](const ZelMemory::Node& node, const ZelMemory::Node* parent) {
+              const ZelMemory::Node& inserted = to.insertRecord(node, parent);
+              from.forEachChild(node, [&](const ZelMemory::Node& child) { copy(child, &inserted); });
+          };
+    copy(*root, nullptr);
+}
+
+int nodeCount(ZelMemory::ReadTxn& txn)
+{
+    std::vector<const ZelMemory::Node*> nodes;
+    txn.allNodes(nodes);
+    return static_cast<int>(nodes.size());
+}
+
+QString exceptionText(const std::exception& e)
+{
+#ifdef ZEL_HAVE_STORE_URLS
+    if (const auto* storeError = dynamic_cast<const ZelSql::StoreError*>(&e))
+        return storeError->message();
+#endif
+    return QString::fromLocal8Bit(e.what());
+}
+
 } // namespace
 
 namespace ZelMemory {
@@ -65,6 +110,7 @@ struct Zel_Store::Private {
     QString serverName;
     int schemaVersion = 0;
     boost::shared_ptr<Zel_MemoryTree> tree;
+    QString file; // memory:FILE.json: the file
     boost::shared_ptr<ZelMemory::Store> store;
 };
 
@@ -87,7 +133,7 @@ boost::shared_ptr<Zel_Store> Zel_Store::ofTree(const boost::shared_ptr<Zel_Memor
     return store;
 }
 
-boost::shared_ptr<Zel_Store> Zel_Store::open(const QString& url, QString* error)
+boost::shared_ptr<Zel_Store> Zel_Store::open(const QString& url, QString* error, OpenMode mode)
 {
     auto fail = [error](const QString& message) {
         if (error)
@@ -121,6 +167,8 @@ boost::shared_ptr<Zel_Store> Zel_Store::open(const QString& url, QString* error)
         boost::shared_ptr<Zel_MemoryTree> tree;
         if (path.isEmpty()) {
             tree = Zel_MemoryTree::sample();
+        } else if (mode == CreateMissingFile && !QFileInfo::exists(path)) {
+            tree = emptyTree();
         } else {
             QString why;
             tree = Zel_MemoryTree::fromFile(path, &why);
@@ -129,6 +177,7 @@ boost::shared_ptr<Zel_Store> Zel_Store::open(const QString& url, QString* error)
         }
         boost::shared_ptr<Zel_Store> store = ofTree(tree);
         store->d->url = display;
+        store->d->file = path;
         return store;
     }
 
@@ -195,4 +244,95 @@ boost::shared_ptr<Zel_MemoryTree> Zel_Store::memoryTree() const
 boost::shared_ptr<ZelMemory::Store> Zel_Store::dataSP() const
 {
     return d->store;
+}
+
+bool Zel_Store::counts(Counts& counts, QString* error) const
+{
+    try {
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = d->store->beginRead();
+        const ZelMemory::ServerTables tables = txn->serverTables();
+        counts = Counts();
+        counts.nodes = nodeCount(*txn);
+        counts.users = tables.users.size();
+        counts.keys = tables.keys.size();
+        counts.settings = tables.workgroupSettings.size() + tables.documents.size();
+        for (const ZelMemory::SettingPairs& pairs : tables.applicationSettings)
+            counts.settings += pairs.size();
+        for (const auto& types : tables.userSettings) {
+            for (const ZelMemory::SettingPairs& pairs : types)
+                counts.settings += pairs.size();
+        }
+        txn->commit();
+        return true;
+    } catch (const std::exception& e) {
+        if (error)
+            *error = QStringLiteral("%1: cannot be read: %2").arg(d->url, exceptionText(e));
+        return false;
+    }
+}
+
+QByteArray Zel_Store::exportJson(QString* error) const
+{
+    try {
+        const boost::shared_ptr<Zel_MemoryTree> copy = emptyTree();
+        {
+            const std::unique_ptr<ZelMemory::ReadTxn> from = d->store->beginRead();
+            if (!from->root()) {
+                if (error)
+                    *error = QStringLiteral("%1: the store holds no tree to export").arg(d->url);
+                return QByteArray();
+            }
+            const std::unique_ptr<ZelMemory::WriteTxn> to = copy->data().beginWrite();
+            copyRecords(*from, *to);
+            to->commit();
+            from->commit();
+        }
+        return copy->toJson();
+    } catch (const std::exception& e) {
+        if (error)
+            *error = QStringLiteral("%1: cannot be exported: %2").arg(d->url, exceptionText(e));
+        return QByteArray();
+    }
+}
+
+bool Zel_Store::importJson(const QByteArray& json, const QString& sourceName, bool replace, QString* error)
+{
+    QString why;
+    // The file is read and checked against the server's rules whole before
+    // the store is touched.
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::fromJson(json, sourceName, &why);
+    if (!tree) {
+        if (error)
+            *error = why;
+        return false;
+    }
+    try {
+        const std::unique_ptr<ZelMemory::WriteTxn> to = d->store->beginWrite();
+        if (to->root()) {
+            if (!replace) {
+                if (error)
+                    *error = QStringLiteral("%1 holds a tree already (%2 nodes)").arg(d->url).arg(nodeCount(*to));
+                return false;
+            }
+            to->removeEverything();
+        }
+        const std::unique_ptr<ZelMemory::ReadTxn> from = tree->data().beginRead();
+        copyRecords(*from, *to);
+        from->commit();
+        to->commit();
+    } catch (const std::exception& e) {
+        if (error)
+            *error = QStringLiteral("%1: cannot import %2: %3").arg(d->url, sourceName, exceptionText(e));
+        return false;
+    }
+    if (d->tree)
+        d->serverName = d->tree->serverName();
+    return true;
+}
+
+bool Zel_Store::save(QString* error) const
+{
+    if (d->kind != Memory || d->file.isEmpty())
+        return true;
+    return d->tree->saveFile(d->file, error);
 }

@@ -30,6 +30,7 @@
 
 #include "zel_memory_export.h"
 
+#include <QByteArray>
 #include <QString>
 #include <boost/shared_ptr.hpp>
 
@@ -46,10 +47,14 @@ class ZEL_MEMORY_EXPORT Zel_Store
 {
 public:
     enum Kind { Memory, Sqlite, Postgresql };
+    // What open does when memory:FILE.json names no file: refuse, or open an
+    // empty store that save() writes to the file (a target to import into).
+    enum OpenMode { OpenExisting, CreateMissingFile };
 
     // The store the URL names; empty on failure, with *error (when given)
     // saying what was wrong.
-    static boost::shared_ptr<Zel_Store> open(const QString& url, QString* error = nullptr);
+    static boost::shared_ptr<Zel_Store> open(const QString& url, QString* error = nullptr,
+                                             OpenMode mode = OpenExisting);
     // The store that holds tree (the sample when tree is empty).
     static boost::shared_ptr<Zel_Store> ofTree(const boost::shared_ptr<Zel_MemoryTree>& tree);
 
@@ -67,6 +72,34 @@ public:
     int schemaVersion() const;
     // The in-memory tree of a memory store; empty for every other kind.
     boost::shared_ptr<Zel_MemoryTree> memoryTree() const;
+
+    // What the store holds.
+    struct Counts {
+        int nodes = 0;    // the root included; 0 for an empty store
+        int users = 0;
+        int keys = 0;     // property keys
+        int settings = 0; // workgroup, application and user settings, and settings documents
+    };
+    // The counts; false with *error when the store cannot be read.
+    bool counts(Counts& counts, QString* error = nullptr) const;
+
+    // Copying whole trees, in the JSON form of Zel_MemoryTree (the same for
+    // every kind of store, so that a tree exported and imported again is
+    // exported to the same bytes). Each reads or writes in one transaction.
+    //
+    // The whole store as JSON; empty with *error on failure (an empty store
+    // cannot be exported).
+    QByteArray exportJson(QString* error = nullptr) const;
+    // Puts the tree of the JSON text (sourceName names it in messages) into
+    // the store: the nodes with their IDs and monikers, users, keys,
+    // resolutions, settings. A store that holds a tree already is refused
+    // unless replace is true, when the tree is replaced whole. False with
+    // *error on failure, with nothing changed.
+    bool importJson(const QByteArray& json, const QString& sourceName, bool replace, QString* error = nullptr);
+    // A memory:FILE.json store: writes the tree to its file. Other stores
+    // keep every change on commit, and a memory: store lives only in this
+    // process: nothing to do. False with *error on failure.
+    bool save(QString* error = nullptr) const;
 
     // The backend's own access to the records (not for applications).
     boost::shared_ptr<ZelMemory::Store> dataSP() const;

@@ -13,6 +13,8 @@
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
+#include <QJsonDocument>
+#include <QJsonParseError>
 #include <QTemporaryDir>
 
 #include <stdexcept>
@@ -261,4 +263,187 @@ TEST(Zel_StoreTest, SessionsOnAnOpenedStoreShareItsRecordsAndHearEachOther)
     EXPECT_EQ(QStringLiteral("bad store URL \"nosuch:x\": unknown store type \"nosuch\"; %1").arg(QLatin1String(Expected)), error);
     byUrl.reset();
     engine.DeliverAll();
+}
+
+namespace {
+
+// The sample with a generated part that holds every kind of record: folders
+// three deep, clips with media, properties with custom values, reservations
+// with and without an end, per-user permissions, frame locators and
+// restrictions, dependencies, nodes the server placed, plus keys, settings
+// of every type and a settings document.
+boost::shared_ptr<Zel_MemoryTree> generatedTree()
+{
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    const std::unique_ptr<ZelMemory::WriteTxn> txn = tree->data().beginWrite();
+    const QDateTime when = QDateTime(QDate(2026, 4, 1), QTime(9, 30), Qt::UTC);
+    const ZelMemory::Node* root = txn->root();
+    int serial = 0;
+    std::function<void(const ZelMemory::Node&, int)> fill = [&](const ZelMemory::Node& parent, int depth) {
+        for (int i = 0; i < 3; ++i) {
+            ZelMemory::Node folder;
+            folder.name = QStringLiteral("Generated %1.%2").arg(depth).arg(i);
+            folder.mimeType = QStringLiteral("bin");
+            const ZelMemory::Node& inserted = txn->insertNode(folder, parent);
+            if (depth < 3)
+                fill(inserted, depth + 1);
+            ZelMemory::Node clip;
+            clip.name = QStringLiteral("Clip %1").arg(++serial);
+            clip.mimeType = QStringLiteral("masterclip");
+            clip.mobId = QStringLiteral("060a2b340101010101010f00.13000000.9%1").arg(serial, 3, 10, QLatin1Char('0'));
+            clip.properties = {ZelMemory::Property{QStringLiteral("Tape"), QStringLiteral("T%1").arg(serial), QString()},
+                               ZelMemory::Property{QStringLiteral("Comments"), QStringLiteral("a \"quoted\" note\nover two lines"),
+                                                   QStringLiteral("<custom n=\"%1\"/>").arg(serial)}};
+            clip.media = {ZelMemory::Media{QStringLiteral("/media/clip%1.mxf").arg(serial), QStringLiteral("1")}};
+            clip.created = when.addSecs(serial);
+            clip.modified = when.addSecs(2 * serial);
+            clip.userPlaced = serial % 2 == 0;
+            clip.permissions.insert(QStringLiteral("assistant"), ZelMemory::PermRead);
+            clip.permissions.insert(QStringLiteral("*"), ZelMemory::PermRead | ZelMemory::PermCopy);
+            clip.locators = {ZelMemory::Marker{QStringLiteral("L%1").arg(serial),
+                                               {{QStringLiteral("Frame"), QString::number(serial * 10)},
+                                                {QStringLiteral("Comment"), QStringLiteral("look")}}}};
+            clip.restrictions = {ZelMemory::Marker{QStringLiteral("R%1").arg(serial), {{QStringLiteral("Frame"), QStringLiteral("5")}}}};
+            if (serial % 3 == 0) {
+                clip.reservation.user = QStringLiteral("producer");
+                clip.reservation.since = when;
+                if (serial % 2 == 0)
+                    clip.reservation.until = when.addDays(serial);
+            }
+            const ZelMemory::Node& stored = txn->insertNode(clip, inserted);
+            ZelMemory::Node& edited = txn->edit(stored);
+            edited.dependencies = {ZelMemory::Dependency{parent.moniker, QStringLiteral("source"), serial % 4}};
+        }
+    };
+    fill(*root, 1);
+    ZelMemory::KeyDesc key;
+    key.key = QStringLiteral("Mood");
+    key.displayName = QStringLiteral("Mood");
+    key.internalName = QStringLiteral("mood");
+    key.hasCustomValues = true;
+    key.textSearchable = false;
+    key.modifiable = false;
+    txn->insertKey(key);
+    for (int type = 0; type < 3; ++type)
+        txn->setUserSettings(QStringLiteral("editor"), type,
+                             {{QStringLiteral("Type.%1").arg(type), QStringLiteral("value %1").arg(type)}});
+    txn->setApplicationSettings(QStringLiteral("generator"), {{QStringLiteral("Size"), QStringLiteral("3")},
+                                                             {QStringLiteral("Empty"), QString()}});
+    txn->setDocument(QStringLiteral("layout"), QStringLiteral("<layout><pane name=\"bins\"/></layout>"));
+    txn->commit();
+    return tree;
+}
+
+QByteArray exported(const boost::shared_ptr<Zel_Store>& store)
+{
+    QString error;
+    const QByteArray json = store->exportJson(&error);
+    EXPECT_FALSE(json.isEmpty()) << error.toStdString();
+    return json;
+}
+
+} // namespace
+
+TEST(Zel_StoreTest, ExportImportExportGivesTheSameBytesForEveryKindOfRecord)
+{
+    const boost::shared_ptr<Zel_MemoryTree> tree = generatedTree();
+    const boost::shared_ptr<Zel_Store> source = Zel_Store::ofTree(tree);
+    const QByteArray json = exported(source);
+    // The export is the tree file form itself.
+    EXPECT_EQ(tree->toJson(), json);
+    ASSERT_TRUE(json.contains("\"until\"") && json.contains("\"userPlaced\"") && json.contains("\"site\"")
+                && json.contains("\"restrictions\"") && json.contains("\"layout\""));
+
+    QTemporaryDir dir;
+    ASSERT_TRUE(dir.isValid());
+    const QString path = dir.filePath(QStringLiteral("copy.json"));
+    QString error;
+    const boost::shared_ptr<Zel_Store> target
+        = Zel_Store::open(QStringLiteral("memory:") + path, &error, Zel_Store::CreateMissingFile);
+    ASSERT_TRUE(target) << error.toStdString();
+    Zel_Store::Counts counts;
+    ASSERT_TRUE(target->counts(counts, &error)) << error.toStdString();
+    EXPECT_EQ(0, counts.nodes);
+    EXPECT_EQ(0, counts.users);
+    EXPECT_FALSE(QFileInfo::exists(path));
+    // An empty store has nothing to export.
+    EXPECT_TRUE(target->exportJson(&error).isEmpty());
+    EXPECT_EQ(QStringLiteral("memory:%1: the store holds no tree to export").arg(path), error);
+
+    ASSERT_TRUE(target->importJson(json, QStringLiteral("generated.json"), false, &error)) << error.toStdString();
+    EXPECT_EQ(json, exported(target));
+    ASSERT_TRUE(target->save(&error)) << error.toStdString();
+    EXPECT_EQ(json, readAll(path));
+
+    ASSERT_TRUE(target->counts(counts, &error)) << error.toStdString();
+    EXPECT_EQ(tree->nodeCount(), counts.nodes);
+    EXPECT_EQ(4, counts.users);
+    EXPECT_EQ(tree->nodeCount() - Zel_MemoryTree::sample()->nodeCount(), 2 * (3 + 9 + 27));
+
+    // The copy is a working tree: a session on it finds a generated clip by
+    // its path and reads it as the source's session does.
+    EXPECT_EQ(tree->monikerAt(QStringLiteral("/Generated 1.0/Generated 2.0/Generated 3.0/Clip 1")),
+              target->memoryTree()->monikerAt(QStringLiteral("/Generated 1.0/Generated 2.0/Generated 3.0/Clip 1")));
+    EXPECT_FALSE(target->memoryTree()->monikerAt(QStringLiteral("/Generated 1.0/Generated 2.0/Generated 3.0/Clip 1")).isEmpty());
+}
+
+TEST(Zel_StoreTest, ImportRefusesAHeldTreeOrABadFileAndChangesNothing)
+{
+    QString error;
+    const boost::shared_ptr<Zel_Store> store = Zel_Store::open(QStringLiteral("memory:"), &error);
+    ASSERT_TRUE(store) << error.toStdString();
+    const QByteArray before = exported(store);
+    const QByteArray generated = generatedTree()->toJson();
+
+    EXPECT_FALSE(store->importJson(generated, QStringLiteral("generated.json"), false, &error));
+    EXPECT_EQ(QStringLiteral("memory: holds a tree already (%1 nodes)").arg(Zel_MemoryTree::sample()->nodeCount()), error);
+    EXPECT_EQ(before, exported(store));
+
+    // A file that breaks the server's rules is refused before the store is
+    // touched, also when it would replace the tree.
+    QByteArray slash = generated;
+    slash.replace("\"Generated 1.0\"", "\"Generated/1.0\"");
+    ASSERT_NE(generated, slash);
+    EXPECT_FALSE(store->importJson(slash, QStringLiteral("slash.json"), true, &error));
+    EXPECT_TRUE(error.startsWith(QStringLiteral("slash.json: root.children["))) << error.toStdString();
+    EXPECT_EQ(before, exported(store));
+    EXPECT_FALSE(store->importJson("{ \"format\": ", QStringLiteral("cut.json"), true, &error));
+    QJsonParseError parseError;
+    QJsonDocument::fromJson("{ \"format\": ", &parseError);
+    EXPECT_EQ(QStringLiteral("cut.json:1:%1: %2").arg(parseError.offset + 1).arg(parseError.errorString()), error);
+    EXPECT_EQ(before, exported(store));
+
+    // Replacing takes the whole new tree and nothing of the old one.
+    ASSERT_TRUE(store->importJson(generated, QStringLiteral("generated.json"), true, &error)) << error.toStdString();
+    EXPECT_EQ(generated, exported(store));
+}
+
+TEST(Zel_StoreTest, CopyingWritesRollBackWhole)
+{
+    // removeEverything and insertRecord are undone with the transaction
+    // that made them.
+    const boost::shared_ptr<Zel_MemoryTree> tree = Zel_MemoryTree::sample();
+    const QByteArray before = tree->toJson();
+    {
+        const std::unique_ptr<ZelMemory::WriteTxn> txn = tree->data().beginWrite();
+        const ZelMemory::ServerTables tables = txn->serverTables();
+        const ZelMemory::Node root = *txn->root();
+        txn->removeEverything();
+        EXPECT_EQ(nullptr, txn->root());
+        EXPECT_EQ(nullptr, txn->user(QStringLiteral("editor")));
+        ZelMemory::ServerTables other = tables;
+        other.serverName = QStringLiteral("Other");
+        txn->setServerTables(other);
+        const ZelMemory::Node& newRoot = txn->insertRecord(root, nullptr);
+        ZelMemory::Node child;
+        child.id = QStringLiteral("X1");
+        child.moniker = QStringLiteral("zel-mem://X1");
+        child.name = QStringLiteral("Only child");
+        child.mimeType = QStringLiteral("bin");
+        txn->insertRecord(child, &newRoot);
+        EXPECT_EQ(1, txn->childCount(*txn->root()));
+        EXPECT_THROW(txn->insertRecord(root, nullptr), std::logic_error);
+    }
+    EXPECT_EQ(before, tree->toJson());
+    EXPECT_EQ(Zel_MemoryTree::sample()->nodeCount(), tree->nodeCount());
 }
