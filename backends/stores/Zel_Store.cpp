@@ -1,6 +1,8 @@
 #include "Zel_Store.h"
 
+#include "Zel_MemoryPropertyManager.h"
 #include "Zel_MemoryTree.h"
+#include "Zel_PropertyKeyInfoList.h"
 #include "memory_tree_p.h"
 #include "store_openers_p.h"
 
@@ -325,8 +327,16 @@ bool Zel_Store::importJson(const QByteArray& json, const QString& sourceName, bo
             *error = QStringLiteral("%1: cannot import %2: %3").arg(d->url, sourceName, exceptionText(e));
         return false;
     }
-    if (d->tree)
+    if (d->tree) {
+        // The key descriptions of sessions opened from now on.
         d->serverName = d->tree->serverName();
+        Zel_PropertyKeyInfoList keys;
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = d->store->beginRead();
+        for (const ZelMemory::KeyDesc& key : txn->serverTables().keys)
+            keys.addIfKeyNotInList(ZelMemory::keyInfo(key));
+        txn->commit();
+        d->tree->data().propertyManager.reset(new Zel_MemoryPropertyManager(keys));
+    }
     return true;
 }
 

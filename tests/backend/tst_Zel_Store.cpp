@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "BackendRecorders.h"
+#include "Zel_PropertyManager.h"
 #include "Zel_Store.h"
 #include "sql_error_p.h"
 #include "sql_url_p.h"
@@ -385,6 +386,16 @@ TEST(Zel_StoreTest, ExportImportExportGivesTheSameBytesForEveryKindOfRecord)
     EXPECT_EQ(tree->monikerAt(QStringLiteral("/Generated 1.0/Generated 2.0/Generated 3.0/Clip 1")),
               target->memoryTree()->monikerAt(QStringLiteral("/Generated 1.0/Generated 2.0/Generated 3.0/Clip 1")));
     EXPECT_FALSE(target->memoryTree()->monikerAt(QStringLiteral("/Generated 1.0/Generated 2.0/Generated 3.0/Clip 1")).isEmpty());
+    // Sessions on the copy know its keys, the generated one included.
+    Orv_Engine engine(1);
+    {
+        boost::shared_ptr<Zel_MemorySession> session(new Zel_MemorySession(target, &engine, QStringLiteral("app")));
+        const boost::shared_ptr<Zel_PropertyManager> keys = Zel_Property::getPropertyManagerSP();
+        ASSERT_TRUE(keys);
+        EXPECT_TRUE(keys->getKeys().contains(QStringLiteral("Mood")));
+        EXPECT_TRUE(keys->getHasCustomValues(QStringLiteral("Mood")));
+    }
+    engine.DeliverAll();
 }
 
 TEST(Zel_StoreTest, ImportRefusesAHeldTreeOrABadFileAndChangesNothing)
