@@ -12,7 +12,7 @@
 // The URL forms:
 //   memory:                  the bundled sample tree, held in this process
 //   memory:FILE.json         a tree file (Zel_MemoryTree's JSON form), held in
-//                            this process; the file is read, never written
+//                            this process; the file is written only by save()
 //   sqlite:PATH              a SQLite file (sqlite:///ABSOLUTE/PATH too)
 //   postgresql://USER@HOST:PORT/DATABASE?PARAM=VALUE...
 //                            a PostgreSQL database, as libpq reads the URL;
