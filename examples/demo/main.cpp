@@ -210,6 +210,10 @@ struct WatchLogin : Zel_LoginCB {
 // --watch: logs in to the store and prints what it hears until interrupted.
 int watch(const Options& options)
 {
+    // From the start: an interrupt that comes early still ends the watch in
+    // order (after the first line), never half way.
+    std::signal(SIGINT, interrupt);
+    std::signal(SIGTERM, interrupt);
     QString why;
     const boost::shared_ptr<Zel_Store> store = Zel_Store::open(options.watchUrl, &why);
     if (!store) {
@@ -230,8 +234,6 @@ int watch(const Options& options)
                          login->error.toLocal8Bit().constData());
             status = 1;
         } else {
-            std::signal(SIGINT, interrupt);
-            std::signal(SIGTERM, interrupt);
             std::printf("zel-demo: watching every folder of %s (%s) as %s; Ctrl-C ends\n",
                         store->url().toLocal8Bit().constData(), store->serverName().toLocal8Bit().constData(),
                         login->user.toLocal8Bit().constData());
