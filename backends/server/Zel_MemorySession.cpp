@@ -6,6 +6,7 @@
 #include "memory_tree_p.h"
 #include "Zel_MemoryPropertyManager.h"
 #include "Zel_MemoryTree.h"
+#include "Zel_Store.h"
 
 #include "Orv_Engine.h"
 #include "Orv_Request.h"
@@ -92,16 +93,26 @@ template <class Req, class Op>
 using ConcreteRequest = typename std::conditional<std::is_base_of<Zel_Req, Req>::value, ZelMemory::Request<Req, Op>,
                                                   ZelMemory::DirectRequest<Req, Op>>::type;
 
-Zel_ResolutionIDList resolutionsOf(const boost::shared_ptr<Zel_MemoryTree>& tree)
+Zel_ResolutionIDList resolutionsOf(const boost::shared_ptr<ZelMemory::Store>& store)
 {
     Zel_ResolutionIDList list;
-    if (tree) {
-        const std::unique_ptr<ZelMemory::ReadTxn> txn = tree->data().beginRead();
+    if (store) {
+        const std::unique_ptr<ZelMemory::ReadTxn> txn = store->beginRead();
         for (const ZelMemory::Resolution& r : txn->resolutions())
             list.append(Zel_ResolutionID(r.label, r.id));
         txn->commit();
     }
     return list;
+}
+
+boost::shared_ptr<ZelMemory::Store> recordsOf(const boost::shared_ptr<Zel_MemoryTree>& tree)
+{
+    return tree ? boost::shared_ptr<ZelMemory::Store>(tree, &tree->data()) : boost::shared_ptr<ZelMemory::Store>();
+}
+
+boost::shared_ptr<ZelMemory::Store> recordsOf(const boost::shared_ptr<Zel_Store>& store)
+{
+    return store ? store->dataSP() : boost::shared_ptr<ZelMemory::Store>();
 }
 
 // The property managers of the live sessions, oldest first. The newest live
@@ -142,12 +153,37 @@ void unregisterManager(const boost::shared_ptr<Zel_PropertyManager>& manager)
 
 Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tree, Orv_Engine* engine,
                                      const QString& applicationName)
-    : Zel_Session(resolutionsOf(tree))
+    : Zel_Session(resolutionsOf(recordsOf(tree)))
     , mState(new ZelMemory::SessionState)
 {
-    mState->tree = tree ? tree : Zel_MemoryTree::sample();
-    // The store is the tree's records, kept alive by the tree.
-    mState->storeRef = boost::shared_ptr<ZelMemory::Store>(mState->tree, &mState->tree->data());
+    init(Zel_Store::ofTree(tree), engine, applicationName);
+}
+
+Zel_MemorySession::Zel_MemorySession(const boost::shared_ptr<Zel_Store>& store, Orv_Engine* engine,
+                                     const QString& applicationName)
+    : Zel_Session(resolutionsOf(recordsOf(store)))
+    , mState(new ZelMemory::SessionState)
+{
+    init(store ? store : Zel_Store::ofTree(boost::shared_ptr<Zel_MemoryTree>()), engine, applicationName);
+}
+
+boost::shared_ptr<Zel_MemorySession> Zel_MemorySession::open(const QString& url, Orv_Engine* engine,
+                                                             const QString& applicationName, QString* error)
+{
+    const boost::shared_ptr<Zel_Store> store = Zel_Store::open(url, error);
+    if (!store)
+        return boost::shared_ptr<Zel_MemorySession>();
+    return boost::shared_ptr<Zel_MemorySession>(new Zel_MemorySession(store, engine, applicationName));
+}
+
+void Zel_MemorySession::init(const boost::shared_ptr<Zel_Store>& store, Orv_Engine* engine,
+                             const QString& applicationName)
+{
+    mState->opened = store;
+    mState->tree = store->memoryTree();
+    mState->serverName = store->serverName();
+    // The records, kept alive by the opened store.
+    mState->storeRef = boost::shared_ptr<ZelMemory::Store>(store, store->dataSP().get());
     if (engine) {
         mState->engine = engine->getHandle();
         mState->resultQ = engine->getResultQ();
@@ -177,7 +213,7 @@ Zel_MemorySession::~Zel_MemorySession()
 
 QString Zel_MemorySession::getServerName() const
 {
-    return mState->tree->serverName();
+    return mState->serverName;
 }
 
 QString Zel_MemorySession::getServerVersion() const
@@ -227,7 +263,11 @@ void Zel_MemorySession::logout()
 
 Zel_Session::MonikerSP Zel_MemorySession::getRootMonikerSP() const
 {
-    return MonikerSP(new QString(mState->tree->rootMoniker()));
+    if (mState->tree)
+        return MonikerSP(new QString(mState->tree->rootMoniker()));
+    const std::unique_ptr<ZelMemory::ReadTxn> txn = mState->store().beginRead();
+    const ZelMemory::Node* root = txn->root();
+    return MonikerSP(new QString(root ? root->moniker : QString()));
 }
 
 Zel_Session::MonikerSP Zel_MemorySession::getHomeMonikerSP() const
@@ -327,6 +367,11 @@ void Zel_MemorySession::close()
 boost::shared_ptr<Zel_MemoryTree> Zel_MemorySession::getTreeSP() const
 {
     return mState->tree;
+}
+
+boost::shared_ptr<Zel_Store> Zel_MemorySession::getStoreSP() const
+{
+    return mState->opened;
 }
 
 void Zel_MemorySession::simulateConnectionLoss()

@@ -56,6 +56,7 @@ class Orv_Engine;
 class Zel_ConnectionListener;
 class Zel_MemoryPropertyManager;
 class Zel_MemoryTree;
+class Zel_Store;
 
 namespace ZelMemory {
 class SessionObserver;
@@ -73,6 +74,16 @@ public:
     // applicationName names the application's settings on the server.
     Zel_MemorySession(const boost::shared_ptr<Zel_MemoryTree>& tree, Orv_Engine* engine,
                       const QString& applicationName = QStringLiteral("zel"));
+    // A session on an opened store (Zel_Store::open; the bundled sample when
+    // store is empty), otherwise as above.
+    Zel_MemorySession(const boost::shared_ptr<Zel_Store>& store, Orv_Engine* engine,
+                      const QString& applicationName = QStringLiteral("zel"));
+    // A session on the store the URL names (Zel_Store.h lists the forms:
+    // memory:, memory:FILE.json, sqlite:PATH, postgresql://...); empty on
+    // failure, with *error (when given) naming what was wrong.
+    static boost::shared_ptr<Zel_MemorySession> open(const QString& url, Orv_Engine* engine,
+                                                     const QString& applicationName = QStringLiteral("zel"),
+                                                     QString* error = nullptr);
     virtual ~Zel_MemorySession();
 
     // --- The connection and the session's state ---------------------------
@@ -113,8 +124,11 @@ public:
 
     // --- The in-memory backend's own -----------------------------------------
 
-    // The tree this session works on.
+    // The tree this session works on; empty when its store is not kept in
+    // memory.
     boost::shared_ptr<Zel_MemoryTree> getTreeSP() const;
+    // The store this session works on.
+    boost::shared_ptr<Zel_Store> getStoreSP() const;
     // The connection drops: requests fail with NotConnected and the status
     // callback hears disconnected(). Nothing happens when it is already down.
     void simulateConnectionLoss();
@@ -134,6 +148,8 @@ public:
 private:
     Zel_MemorySession(const Zel_MemorySession&) = delete;
     Zel_MemorySession& operator=(const Zel_MemorySession&) = delete;
+
+    void init(const boost::shared_ptr<Zel_Store>& store, Orv_Engine* engine, const QString& applicationName);
 
     template <class Req, class Op>
     boost::shared_ptr<Req> make(const boost::shared_ptr<typename Op::Callback>& callback, typename Op::Args args);

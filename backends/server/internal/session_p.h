@@ -42,6 +42,7 @@
 
 class Orv_EngineHandle;
 class Zel_MemoryTree;
+class Zel_Store;
 class Zel_EventCB;
 class Zel_Node;
 class Zel_NodeListener;
@@ -99,7 +100,9 @@ private:
 class SessionState
 {
 public:
-    boost::shared_ptr<Zel_MemoryTree> tree; // the session's tree, for the session's own accessors
+    boost::shared_ptr<Zel_MemoryTree> tree; // the session's tree, for the session's own accessors (memory stores)
+    boost::shared_ptr<Zel_Store> opened;    // the opened store the session works on
+    QString serverName;
     // The store of the session's records; the rules reach them only through it.
     boost::shared_ptr<Store> storeRef;
     Store& store() const { return *storeRef; }

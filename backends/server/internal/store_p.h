@@ -213,6 +213,19 @@ typedef QList<QPair<QString, QString>> SettingPairs;
 // "site"), by Zel_GetUserSettingsCB::UserSettingsType value 0, 1, 2.
 const char* userSettingsTypeName(int type);
 
+// Everything a store holds besides its nodes, for copying a whole store.
+struct ServerTables {
+    QString serverName;
+    QList<User> users;
+    QList<KeyDesc> keys;
+    QList<Resolution> resolutions;
+    SettingPairs workgroupSettings;
+    QMap<QString, SettingPairs> applicationSettings;          // application -> settings
+    QMap<QString, QMap<int, SettingPairs>> userSettings;     // user -> settings type -> settings
+    QMap<QString, QString> documents;                        // named settings documents (XML)
+    QStringList linkedProjects;                              // monikers
+};
+
 // One change for the observers: a child of parentMoniker was added, removed
 // or updated.
 struct Change {
@@ -273,6 +286,8 @@ public:
     virtual bool document(const QString& name, QString& xml) = 0;
     // The monikers of the linked projects.
     virtual QStringList linkedProjects() = 0;
+    // Every table besides the nodes (copying a whole store).
+    virtual ServerTables serverTables() = 0;
 
     // --- Ending. ---
     // Runs effect once the transaction has committed (never after a rollback).
@@ -328,6 +343,16 @@ public:
     virtual void setApplicationSettings(const QString& application, const SettingPairs& settings) = 0;
     virtual void setUserSettings(const QString& user, int type, const SettingPairs& settings) = 0;
     virtual void setDocument(const QString& name, const QString& xml) = 0;
+
+    // --- Copying a whole store (importing a tree file, exporting one). ---
+    // Replaces every table besides the nodes.
+    virtual void setServerTables(const ServerTables& tables) = 0;
+    // Inserts a copy of node with its ID and moniker as they are, at the end
+    // of parent's children, or as the root when parent is null (the store
+    // then holds no root). Reports no change.
+    virtual const Node& insertRecord(const Node& node, const Node* parent) = 0;
+    // Removes every node and empties every table. Reports no change.
+    virtual void removeEverything() = 0;
 
     // Change reports, published to the store's observers after commit, in
     // commit order; dropped on rollback.

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <stdexcept>
 #include <utility>
 
 namespace ZelMemory {
@@ -329,6 +330,20 @@ public:
         return true;
     }
     QStringList linkedProjects() override { return mTree.linkedProjects; }
+    ServerTables serverTables() override
+    {
+        ServerTables tables;
+        tables.serverName = mTree.serverName;
+        tables.users = mTree.users;
+        tables.keys = mTree.keys;
+        tables.resolutions = mTree.resolutions;
+        tables.workgroupSettings = mTree.workgroupSettings;
+        tables.applicationSettings = mTree.applicationSettings;
+        tables.userSettings = mTree.userSettings;
+        tables.documents = mTree.documents;
+        tables.linkedProjects = mTree.linkedProjects;
+        return tables;
+    }
 
 protected:
     Tree& mTree;
@@ -467,6 +482,62 @@ public:
         mTree.documents.insert(name, xml);
     }
 
+    void setServerTables(const ServerTables& tables) override
+    {
+        const ServerTables before = serverTables();
+        assignTables(tables);
+        mUndo.push_back([this, before] { assignTables(before); });
+    }
+    const Node& insertRecord(const Node& node, const Node* parent) override
+    {
+        StoredNode record;
+        static_cast<Node&>(record) = node;
+        record.parentId.clear();
+        const QString id = record.id;
+        if (!parent) {
+            if (!mTree.rootId.isEmpty())
+                throw std::logic_error("insertRecord: the store already holds a root");
+            StoredNode& inserted = mTree.addNode(std::move(record));
+            mTree.rootId = id;
+            mUndo.push_back([this, id] {
+                mTree.removeSubtree(id);
+                mTree.rootId.clear();
+            });
+            return inserted;
+        }
+        if (mTree.byId(id))
+            throw std::logic_error("insertRecord: a node with this ID is stored already");
+        StoredNode& inserted = mTree.insertNode(std::move(record), mutableStored(*parent));
+        mUndo.push_back([this, id] { mTree.removeSubtree(id); });
+        return inserted;
+    }
+    void removeEverything() override
+    {
+        struct Everything {
+            ServerTables tables;
+            std::unordered_map<QString, StoredNode, NodeIdHash> nodes;
+            QHash<QString, QString> idByGivenMoniker;
+            QString rootId;
+            std::uint64_t serial;
+        };
+        auto kept = std::make_shared<Everything>();
+        kept->tables = serverTables();
+        kept->nodes.swap(mTree.nodes);
+        kept->idByGivenMoniker.swap(mTree.idByGivenMoniker);
+        kept->rootId = mTree.rootId;
+        kept->serial = mTree.serial;
+        mTree.rootId.clear();
+        assignTables(ServerTables());
+        mEdited.clear();
+        mUndo.push_back([this, kept] {
+            assignTables(kept->tables);
+            mTree.nodes.swap(kept->nodes);
+            mTree.idByGivenMoniker.swap(kept->idByGivenMoniker);
+            mTree.rootId = kept->rootId;
+            mTree.serial = kept->serial;
+        });
+    }
+
 protected:
     void commitData() override
     {
@@ -488,6 +559,18 @@ protected:
     void rollbackToSavepoint(int mark) override { undoTo(static_cast<std::size_t>(mark)); }
 
 private:
+    void assignTables(const ServerTables& tables)
+    {
+        mTree.serverName = tables.serverName;
+        mTree.users = tables.users;
+        mTree.keys = tables.keys;
+        mTree.resolutions = tables.resolutions;
+        mTree.workgroupSettings = tables.workgroupSettings;
+        mTree.applicationSettings = tables.applicationSettings;
+        mTree.userSettings = tables.userSettings;
+        mTree.documents = tables.documents;
+        mTree.linkedProjects = tables.linkedProjects;
+    }
     // Runs the undo steps after the first count, newest first.
     void undoTo(std::size_t count) noexcept
     {
